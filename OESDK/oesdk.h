@@ -1,0 +1,24 @@
+// OESDK: the whole public API in one header. Compile the host with -I pointing at this folder
+// (or at include/OESDK of an installation) and include "oesdk.h".
+#ifndef OESDK_OESDK_H
+#define OESDK_OESDK_H
+
+#include "oeexport.h"
+
+// Platform layer
+#include "platform/oeplatform.h"
+
+// Foundation types
+#include "foundation/oememory.h"
+#include "foundation/oestatus.h"
+#include "foundation/oeparsewarning.h"
+#include "foundation/oestring.h"
+#include "foundation/oebuffer.h"
+#include "foundation/oedynarr.h"
+#include "foundation/oethread.h"
+
+// Tags and data objects
+#include "tags/oetagid.h"
+#include "tags/oetagdictionary.h"
+
+#endif

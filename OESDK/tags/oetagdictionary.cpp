@@ -1,0 +1,192 @@
+#include "tags/oetagdictionary.h"
+
+#include "foundation/oememory.h"
+#include "foundation/oethread.h"
+
+#include <cctype>
+#include <cstdlib>
+#include <cstring>
+#include <mutex>
+
+OECaseType TagDictionary::m_compareType = OECaseSensitive;
+std::atomic<OETagDictionary*> OETagDictionary::ms_theOETagDictionary{nullptr};
+
+namespace {
+
+// Byte comparison over n bytes, ASCII case folded when asked.
+inline int CompareBytes(const char* a, const char* b, unsigned short n, OECaseType caseType) {
+    if (caseType == OECaseSensitive) return std::strncmp(a, b, n);
+    for (unsigned short i = 0; i < n; ++i) {
+        int ca = std::toupper(static_cast<unsigned char>(a[i]));
+        int cb = std::toupper(static_cast<unsigned char>(b[i]));
+        if (ca != cb) return ca - cb;
+        if (ca == 0) return 0;
+    }
+    return 0;
+}
+
+// The name order: shorter names first, then bytes.
+inline int CompareNames(const char* a, unsigned short lengthA, const char* b, unsigned short lengthB,
+                        OECaseType caseType) {
+    if (lengthA != lengthB) return static_cast<int>(lengthA) - static_cast<int>(lengthB);
+    return CompareBytes(a, b, lengthA, caseType);
+}
+
+std::mutex& SingletonMutex() {
+    static std::mutex m;
+    return m;
+}
+
+} // namespace
+
+unsigned short OEBinarySearch::Search() {
+    short lo = 0;
+    short hi = static_cast<short>(Count() - 1);
+    while (lo <= hi) {
+        short mid = static_cast<short>((lo + hi) / 2);
+        int c = Compare(static_cast<unsigned short>(mid));
+        if (c == 0) return static_cast<unsigned short>(mid);
+        if (c < 0)
+            hi = static_cast<short>(mid - 1);
+        else
+            lo = static_cast<short>(mid + 1);
+    }
+    return kNotFound;
+}
+
+int SearchDictionaryEntry::Compare(unsigned short position) {
+    const OECompareInfo& e = m_index[position];
+    return CompareNames(m_name, m_length, e.m_entry->m_name, e.m_length, m_caseType);
+}
+
+int SearchDictionaryIndex::Compare(unsigned short position) {
+    return static_cast<int>(m_id) - static_cast<int>(m_index[position].m_id);
+}
+
+int TagDictionary::sCompare(const OECompareInfo& a, const OECompareInfo& b) {
+    return CompareNames(a.m_entry->m_name, a.m_length, b.m_entry->m_name, b.m_length, m_compareType);
+}
+
+int TagDictionary::sCompareTag(const void* a, const void* b) {
+    return sCompare(*static_cast<const OECompareInfo*>(a), *static_cast<const OECompareInfo*>(b));
+}
+
+int TagDictionary::sCompareTagID(const void* a, const void* b) {
+    unsigned short ia = static_cast<unsigned short>(static_cast<const OEIdIndexInfo*>(a)->m_id & 0xFFFFu);
+    unsigned short ib = static_cast<unsigned short>(static_cast<const OEIdIndexInfo*>(b)->m_id & 0xFFFFu);
+    return static_cast<int>(ia) - static_cast<int>(ib);
+}
+
+TagDictionary::TagDictionary(const OETagDictionaryEntry* table, unsigned short count)
+    : m_table(table), m_nameIndex(nullptr), m_count(count), m_idIndex(nullptr), m_lowestId(OETAG_NONE),
+      m_mode(kContiguous) {
+    m_compareType = OECaseSensitive;
+    if (!table) {
+        m_count = 0;
+        return;
+    }
+    m_nameIndex = static_cast<OECompareInfo*>(OEMemory::Malloc(sizeof(OECompareInfo) * (count ? count : 1)));
+    if (!m_nameIndex) return;  // error code 1 already recorded; the dictionary is unusable
+    for (unsigned short i = 0; i < count; ++i) {
+        m_nameIndex[i].m_entry = &table[i];
+        m_nameIndex[i].m_length = static_cast<unsigned short>(std::strlen(table[i].m_name));
+    }
+    std::qsort(m_nameIndex, count, sizeof(OECompareInfo), &TagDictionary::sCompareTag);
+
+    m_idIndex = static_cast<OEIdIndexInfo*>(OEMemory::Malloc(sizeof(OEIdIndexInfo) * (count ? count : 1)));
+    if (!m_idIndex) {
+        m_mode = kLinearScan;
+        return;
+    }
+    for (unsigned short i = 0; i < count; ++i) {
+        m_idIndex[i].m_namePosition = i;
+        m_idIndex[i].m_id = m_nameIndex[i].m_entry->m_id;
+    }
+    std::qsort(m_idIndex, count, sizeof(OEIdIndexInfo), &TagDictionary::sCompareTagID);
+    if (AreTagIDsContiguous()) {
+        m_mode = kContiguous;
+        m_lowestId = count ? m_idIndex[0].m_id : OETAG_NONE;
+    } else {
+        m_mode = kBinarySearch;
+    }
+}
+
+TagDictionary::~TagDictionary() {
+    OEMemory::Free(m_nameIndex);
+    OEMemory::Free(m_idIndex);
+}
+
+unsigned short TagDictionary::AreTagIDsContiguous() const {
+    for (unsigned short i = 1; i < m_count; ++i)
+        if (m_idIndex[i].m_id != m_idIndex[i - 1].m_id + 1) return 0;
+    return 1;
+}
+
+const OETagDictionaryEntry* TagDictionary::FindDictionaryEntry(const char* name, unsigned short length,
+                                                               OECaseType caseType) const {
+    if (!m_nameIndex || !name) return nullptr;
+    SearchDictionaryEntry search(m_nameIndex, m_count, name, length, caseType);
+    unsigned short position = search.Search();
+    return position == OEBinarySearch::kNotFound ? nullptr : m_nameIndex[position].m_entry;
+}
+
+const OETagDictionaryEntry* TagDictionary::GetTagID(const char* name, unsigned short length, OETagID* id,
+                                                    OECaseType caseType) const {
+    const OETagDictionaryEntry* entry = FindDictionaryEntry(name, length, caseType);
+    if (id) *id = entry ? entry->m_id : OETAG_NONE;
+    return entry;
+}
+
+const OETagDictionaryEntry* TagDictionary::FindDictionaryEntry(OETagID id) const {
+    for (unsigned short i = 0; i < m_count; ++i)
+        if (m_table[i].m_id == id) return &m_table[i];
+    return nullptr;
+}
+
+const char* TagDictionary::GetTagString(OETagID id) const {
+    switch (m_mode) {
+    case kContiguous: {
+        // The fast path every name written by the builder takes: no range check.
+        unsigned short position = static_cast<unsigned short>((id & 0xFFFFu) - (m_lowestId & 0xFFFFu));
+        return m_nameIndex[m_idIndex[position].m_namePosition].m_entry->m_name;
+    }
+    case kBinarySearch: {
+        SearchDictionaryIndex search(m_idIndex, m_count, id);
+        unsigned short position = search.Search();
+        return position == OEBinarySearch::kNotFound ? nullptr : m_table[position].m_name;
+    }
+    case kLinearScan:
+    default: {
+        const OETagDictionaryEntry* entry = FindDictionaryEntry(id);
+        return entry ? entry->m_name : nullptr;
+    }
+    }
+}
+
+OETagDictionary::OETagDictionary() : TagDictionary(GetOETagDictionary(), NumberOfOEDictionaryEntry()) {}
+
+OETagDictionary::~OETagDictionary() {
+    OETagDictionary* self = this;
+    ms_theOETagDictionary.compare_exchange_strong(self, nullptr);
+}
+
+OETagDictionary* OETagDictionary::TheOETagDictionary() {
+    OETagDictionary* d = ms_theOETagDictionary.load(std::memory_order_acquire);
+    if (d) return d;
+    std::lock_guard<std::mutex> lock(SingletonMutex());
+    d = ms_theOETagDictionary.load(std::memory_order_acquire);
+    if (d) return d;
+    d = OEMemory::New<OETagDictionary>();
+    if (d && !d->IsUsable()) {
+        // The name index could not be made: report failure and try again next time.
+        delete d;
+        d = nullptr;
+    }
+    ms_theOETagDictionary.store(d, std::memory_order_release);
+    return d;
+}
+
+int OETagDictionary::Destroy(OETagDictionary* dictionary) {
+    delete dictionary;
+    return 0;
+}
