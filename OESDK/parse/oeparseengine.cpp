@@ -107,11 +107,11 @@ void OEParseEngine::SyncOffset(unsigned long pos) {
     if (m_buffer) m_buffer->SetBufferOffset(pos);
 }
 
-void OEParseEngine::LogAt(unsigned long pos, int code, const char* text, unsigned long length) {
+void OEParseEngine::LogAt(unsigned long pos, int code, const char* text, unsigned long length, OETagID tag) {
     SyncOffset(pos);
     OEString copy;
     AssignRange(copy, text, length);
-    OELogParseWarning(static_cast<OEParseWarning>(code), copy.c_str());
+    OELogParseWarning(static_cast<OEParseWarning>(code), copy.c_str(), nullptr, tag);
 }
 
 const OETagDictionaryEntry* OEParseEngine::ResolveTagName(const char* name, unsigned short length) {
@@ -393,6 +393,13 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
             return OETK_ERROR;
 
         case kRawEndTag: {
+            if (m_elementEntry && nameLength == m_elementNameLength &&
+                std::memcmp(name, m_data + m_elementNameStart, nameLength) == 0) {
+                entry = m_elementEntry;
+                m_elementEntry = nullptr;
+                return OETK_ENDTAG;
+            }
+            m_elementEntry = nullptr;
             entry = ResolveTagName(name, nameLength);
             if (entry) {
                 m_unknownElement.Assign("", 0);
@@ -411,7 +418,8 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
         case kRawEmpty: {
             // "<MEMO/>": an element without a value.
             const OETagDictionaryEntry* e = ResolveTagName(name, nameLength);
-            LogAt(token.m_tagStart, e ? OEPW_EMPTYELEM : OEPW_UNKNOWNTAG, name, nameLength);
+            LogAt(token.m_tagStart, e ? OEPW_EMPTYELEM : OEPW_UNKNOWNTAG, name, nameLength,
+                  e ? e->m_id : OETAG_NONE);
             continue;
         }
 
@@ -427,9 +435,13 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
                     continue;
                 }
                 m_unknownElement.Assign("", 0);
+                m_elementEntry = entry;
+                m_elementNameStart = token.m_start;
+                m_elementNameLength = nameLength;
                 if (!ReadText(next)) return OETK_ERROR;
                 return OETK_ELEMENT;
             }
+            m_elementEntry = nullptr;
             m_lookAhead = next;
             m_haveLookAhead = true;
             m_lastStartEmpty = next.m_kind == kRawEndTag && next.m_length == token.m_length &&

@@ -81,7 +81,7 @@ private:
     void ScanTag(unsigned long lt, RawToken& token);
     unsigned short ReadText(const RawToken& token);
     unsigned short NextPiHeader(OEHeaderTag& tag, OEString& name, OEString& value);
-    void LogAt(unsigned long pos, int code, const char* text, unsigned long length);
+    void LogAt(unsigned long pos, int code, const char* text, unsigned long length, OETagID tag = OETAG_NONE);
     void SyncOffset(unsigned long pos);
 
     OETagDictionary* m_dictionary;
@@ -98,7 +98,13 @@ private:
     bool m_headersDone;
     bool m_lastStartEmpty;
     OEString m_value;
-    OEString m_unknownElement; // name of the last unknown element, whose end tag is dropped too
+    OEString m_unknownElement;
+    // The last element's name as written and its row: its XML-style end tag resolves to the
+    // same row without a second lookup (and without logging a lower-case name twice).
+    unsigned long m_elementNameStart;
+    unsigned short m_elementNameLength;
+    const OETagDictionaryEntry*
+        m_elementEntry; // name of the last unknown element, whose end tag is dropped too
 };
 
 #endif
