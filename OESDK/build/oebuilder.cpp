@@ -71,7 +71,7 @@ OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringO
     if (status == OEBS_OK && checkRequired) {
         OEDataObj* missingIn = root;
         OETagID missingTag = OETAG_NONE;
-        if (!OEUtility::AllRequiredPresent(missingIn, missingTag)) {
+        if (!OEUtility::AllRequiredPresent(missingIn, &missingIn, &missingTag)) {
             SetFailedObject(missingIn);
             status = OEBS_MISSINGREQUIRED;
         }

@@ -357,7 +357,7 @@ int OEFileRq::Build(OEBuilder* builder) {
     for (unsigned short i = 0; i < m_requests.Entries(); ++i) {
         OEDataObj* request = m_requests.Get(i);
         if (!request) continue;
-        int status = request->BuildObject(builder, 0);
+        int status = request->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) return status;
     }
     return headerStatus;
@@ -432,7 +432,7 @@ int OEFileRs::Build(OEBuilder* builder) {
     for (unsigned short i = 0; i < m_responses.Entries(); ++i) {
         OEDataObj* response = m_responses.Get(i);
         if (!response) continue;
-        status = response->BuildObject(builder, 0);
+        status = response->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) return status;
     }
     return OEBS_OK;

@@ -1,5 +1,7 @@
 #include "messages/oeaccount.h"
 
+#include "messages/oecurrency.h"
+
 namespace {
 
 const char* const kAcctType[] = {"UNKNOWN", "CHECKING", "SAVINGS", "CREDIT", "MONEYMRKT", "CREDITLINE"};

@@ -2,6 +2,7 @@
 
 #include "foundation/oeparsewarning.h"
 #include "foundation/oethread.h"
+#include "messages/oecurrency.h"
 
 namespace {
 

@@ -5,6 +5,7 @@
 #include "foundation/oethread.h"
 
 #include <cstring>
+#include <string>
 #include <vector>
 
 namespace {
@@ -275,7 +276,7 @@ OEDataObj* OEMessageSetBase::Disconnect(OEDataObjList& list, unsigned short inde
 
 int OEMessageSetBase::Build(OEBuilder* builder) {
     if (m_signOn) {
-        int status = m_signOn->BuildObject(builder, 0);
+        int status = m_signOn->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) {
             builder->SetFailedObject(this);
             return status;
@@ -289,7 +290,7 @@ int OEMessageSetBase::Build(OEBuilder* builder) {
         for (unsigned short i = 0; i < list.Entries(); ++i) {
             OEDataObj* child = list.Get(i);
             if (!child || child->GetType() != row.m_tag) continue;
-            int status = child->BuildObject(builder, 0);
+            int status = child->BuildObject(builder, OETAG_NONE);
             if (status != OEBS_OK) {
                 builder->SetFailedObject(this);
                 return status;
@@ -591,7 +592,7 @@ int OERootBase::Build(OEBuilder* builder) {
         for (unsigned short i = 0; i < m_sets.Entries(); ++i) {
             OEMessageSetBase* set = m_sets.Get(i);
             if (!set || set->GetType() != tag) continue;
-            int status = set->BuildObject(builder, 0);
+            int status = set->BuildObject(builder, OETAG_NONE);
             if (status != OEBS_OK) {
                 builder->SetFailedObject(this);
                 return status;

@@ -279,10 +279,14 @@ OETagID OEResponseTagOf(OETagID requestTag) {
     if (!dictionary || requestTag == OETAG_NONE) return OETAG_NONE;
     const char* name = dictionary->GetTagString(requestTag);
     size_t n = name ? std::strlen(name) : 0;
-    if (n < 2 || n > 62 || name[n - 2] != 'R' || name[n - 1] != 'Q') return OETAG_NONE;
+    if (n < 2 || n > 62) return OETAG_NONE;
+    // The last "RQ" of the name becomes "RS" (STMTRQ, STMTTRNRQ, BANKMSGSRQV1).
+    size_t at = n - 1;
+    while (at > 0 && !(name[at - 1] == 'R' && name[at] == 'Q')) --at;
+    if (at == 0) return OETAG_NONE;
     char rs[64];
     std::memcpy(rs, name, n);
-    rs[n - 1] = 'S';
+    rs[at] = 'S';
     OETagID id = OETAG_NONE;
     if (!dictionary->GetTagID(rs, static_cast<unsigned short>(n), &id, OECaseSensitive)) return OETAG_NONE;
     return id;
@@ -467,7 +471,7 @@ unsigned short OETransRs::AllRequiredPresent() {
     if (n < 2 || n > 62) return 1;
     char rq[64];
     std::memcpy(rq, name, n);
-    rq[n - 1] = 'Q';
+    rq[n - 1] = 'Q';  // the wrappers end in TRNRS
     OETagID rqTag = OETAG_NONE;
     if (!dictionary->GetTagID(rq, static_cast<unsigned short>(n), &rqTag, OECaseSensitive)) return 1;
     const RequiredInner* r = FindRequiredInner(rqTag);
@@ -581,7 +585,7 @@ int OESyncRq::Build(OEBuilder* builder) {
     for (unsigned short i = 0; i < m_trans.Entries(); ++i) {
         OEDataObj* trans = m_trans.Get(i);
         if (!trans) continue;
-        status = trans->BuildObject(builder, 0);
+        status = trans->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) return Fail(builder, static_cast<OEBuildStatus>(status));
     }
     return OEBS_OK;
@@ -670,7 +674,7 @@ int OESyncRs::Build(OEBuilder* builder) {
     for (unsigned short i = 0; i < m_trans.Entries(); ++i) {
         OEDataObj* trans = m_trans.Get(i);
         if (!trans) continue;
-        status = trans->BuildObject(builder, 0);
+        status = trans->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) return Fail(builder, static_cast<OEBuildStatus>(status));
     }
     return OEBS_OK;
