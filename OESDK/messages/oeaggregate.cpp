@@ -7,6 +7,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <string>
 
 namespace {
 
@@ -525,4 +526,62 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
         }
     }
     return CopyBaseMembersFrom(const_cast<OEAggregate*>(other));
+}
+
+void OEAggregate::AmountText(const OEPrecisionInteger& value, OEString& out) {
+    OEPrecisionInteger copy(value);
+    unsigned short scale = copy.Decimal();
+    const char* plain = static_cast<char*>(copy);  // trailing zeros dropped
+    std::string text = plain ? plain : "0";
+    bool negative = !text.empty() && text[0] == '-';
+    std::string digits = negative ? text.substr(1) : text;
+    if (!digits.empty() && digits[0] == '.') digits.insert(0, "0");
+    if (scale > 0 && scale < 30) {
+        size_t point = digits.find('.');
+        size_t have = point == std::string::npos ? 0 : digits.size() - point - 1;
+        if (point == std::string::npos) digits += '.';
+        while (have < scale) {
+            digits += '0';
+            ++have;
+        }
+    }
+    out = ((negative ? "-" : "") + digits).c_str();
+}
+
+unsigned short OEAggregate::GetFieldText(const OEFieldRow* row, OEString& out) const {
+    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST || !ValidateTag(row->m_tag)) return 0;
+    const void* slot = Slot(row);
+    char number[32];
+    switch (row->m_kind) {
+    case OEFK_TEXT:
+        out = *static_cast<const OEString*>(slot);
+        return 1;
+    case OEFK_AMOUNT:
+        AmountText(*static_cast<const OEPrecisionInteger*>(slot), out);
+        return 1;
+    case OEFK_DATETIME:
+        if (!static_cast<const OEDateTime*>(slot)->GetDateString(out)) out = "";
+        return 1;
+    case OEFK_ENUM: {
+        unsigned short v = *static_cast<const unsigned short*>(slot);
+        out = row->m_keywords && v < row->m_keywords->m_count ? row->m_keywords->m_words[v] : "?";
+        return 1;
+    }
+    case OEFK_BOOL:
+        out = *static_cast<const unsigned short*>(slot) ? "Y" : "N";
+        return 1;
+    case OEFK_USHORT:
+        std::snprintf(number, sizeof(number), "%u", static_cast<unsigned>(*static_cast<const unsigned short*>(slot)));
+        break;
+    case OEFK_ULONG:
+        std::snprintf(number, sizeof(number), "%lu", *static_cast<const unsigned long*>(slot));
+        break;
+    case OEFK_SLONG:
+        std::snprintf(number, sizeof(number), "%ld", *static_cast<const long*>(slot));
+        break;
+    default:
+        return 0;
+    }
+    out = number;
+    return 1;
 }

@@ -112,6 +112,13 @@ public:
     // through the factory). 1 on success; 0 for another class, no factory or no memory.
     virtual unsigned short DeepCopyFrom(const OEAggregate* other);
 
+    // The text form of a present element row (as the builder writes it, before escaping): 1, or
+    // 0 for a child row or an element that is not present. For tools that show a tree.
+    unsigned short GetFieldText(const OEFieldRow* row, OEString& out) const;
+    // An exact decimal as written with its own scale (trailing zeros kept, a zero before the
+    // point): -25.00 stays "-25.00", .5 becomes "0.5".
+    static void AmountText(const OEPrecisionInteger& value, OEString& out);
+
 protected:
     // The row for a tag, or null.
     const OEFieldRow* FindRow(OETagID tag) const;
