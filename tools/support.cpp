@@ -26,9 +26,20 @@ class PreservingBuilder : public OEBuilder {
 public:
     PreservingBuilder(OEBuildStringCrLfOpt crlf, unsigned short endTags) : OEBuilder(crlf, endTags) {}
     OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf) override {
-        if (!value.ExceedsSpecLength()) return OEBuilder::AddString(value, macros, crlf);
+        if (!value.ExceedsSpecLength() && value.GetEncoding() != OESE_CDATA)
+            return OEBuilder::AddString(value, macros, crlf);
+        // Over-long text is kept whole, and a value read from a CDATA section is written back as
+        // one CDATA section (the library's own CDATA form writes the text twice), which keeps
+        // its blanks at either end.
         OEString whole(value);
         whole.SetSpecLength(OEString::kUnlimited);
+        if (whole.GetEncoding() == OESE_CDATA) {
+            std::string section = std::string("<![CDATA[") + value.c_str() + "]]>";
+            whole = section.c_str();
+            whole.SetSpecLength(OEString::kUnlimited);
+            whole.SetEncoding(OESE_PLAIN);
+            macros = OEBSM_NONE;
+        }
         return OEBuilder::AddString(whole, macros, crlf);
     }
     using OEBuilder::AddString;
