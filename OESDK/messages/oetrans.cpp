@@ -9,6 +9,7 @@
 
 #include <cstdlib>
 #include <cstring>
+#include <vector>
 
 namespace {
 
@@ -122,12 +123,8 @@ const RequiredInner* FindRequiredInner(OETagID wrapper) {
 }
 
 // ---- transaction request wrapper ----
-// Valid rows: the four elements, then the inner requests whose classes exist. An inner request
-// without a class is not valid here, so the parser skips it (logged) instead of stopping.
-const OETagRow kTransRqValid[] = {{OETAG_TRNUID, OEVM_ALL, 0},   {OETAG_SYNCCOMPLETEINFO, OEVM_ALL, 0},
-                                  {OETAG_CLTCOOKIE, OEVM_ALL, 0}, {OETAG_TAN, OEVM_ALL, 0},
-                                  {OETAG_STMTRQ, OEVM_ALL, 0},    {OETAG_CCSTMTRQ, OEVM_ALL, 0},
-                                  {OETAG_PINCHRQ, OEVM_ALL, 0}};
+// Valid rows: the four elements, then all 52 inner requests (built once, below). An inner request
+// whose class is not part of the library yet has no field row: NewRq answers 4 for it.
 const OETagRow kTransRqRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}};
 const OEFieldRow kTransRqFields[] = {
     {OETAG_TRNUID, OEFK_TEXT, OE_MEMBER(OETransRq, m_trnUid), nullptr, nullptr},
@@ -140,10 +137,7 @@ const OEFieldRow kTransRqFields[] = {
 };
 
 // ---- transaction response wrapper ----
-const OETagRow kTransRsValid[] = {{OETAG_TRNUID, OEVM_ALL, 0},    {OETAG_STATUS, OEVM_ALL, 0},
-                                  {OETAG_CLTCOOKIE, OEVM_ALL, 0}, {OETAG_WARNING, OEVM_ALL, 0},
-                                  {OETAG_STMTRS, OEVM_ALL, 0},    {OETAG_CCSTMTRS, OEVM_ALL, 0},
-                                  {OETAG_PINCHRS, OEVM_ALL, 0}};
+// Valid rows: the four elements, then the responses of all 52 inner requests.
 const OETagRow kTransRsRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}, {OETAG_STATUS, OEVM_ALL, 0}};
 const OEFieldRow kTransRsFields[] = {
     {OETAG_TRNUID, OEFK_TEXT, OE_MEMBER(OETransRs, m_trnUid), nullptr, nullptr},
@@ -253,8 +247,43 @@ const OEFieldRow kSyncRsFields[] = {
     {OETAG_CCACCTFROM, OEFK_CHILD, OE_MEMBER(OESyncRs, m_account), nullptr, OE_MAKE(NewCCAccount)},
 };
 
-const OEAggregateDesc kTransRqDesc = OE_DESC(OETAG_NONE, kTransRqValid, kTransRqRequired, kTransRqFields);
-const OEAggregateDesc kTransRsDesc = OE_DESC(OETAG_NONE, kTransRsValid, kTransRsRequired, kTransRsFields);
+template <size_t NR, size_t NF>
+OEAggregateDesc WrapperDesc(const std::vector<OETagRow>& valid, const OETagRow (&required)[NR], const OEFieldRow (&fields)[NF]) {
+    return OEAggregateDesc{OETAG_NONE,
+                           valid.data(),
+                           static_cast<unsigned short>(valid.size()),
+                           required,
+                           static_cast<unsigned short>(NR),
+                           fields,
+                           static_cast<unsigned short>(NF)};
+}
+
+const OEAggregateDesc& TransRqDesc() {
+    static const std::vector<OETagRow> valid = [] {
+        std::vector<OETagRow> rows = {{OETAG_TRNUID, OEVM_ALL, 0},
+                                      {OETAG_SYNCCOMPLETEINFO, OEVM_ALL, 0},
+                                      {OETAG_CLTCOOKIE, OEVM_ALL, 0},
+                                      {OETAG_TAN, OEVM_ALL, 0}};
+        for (const InnerRow& r : kInner) rows.push_back(OETagRow{r.m_inner, OEVM_ALL, 0});
+        return rows;
+    }();
+    static const OEAggregateDesc desc = WrapperDesc(valid, kTransRqRequired, kTransRqFields);
+    return desc;
+}
+
+const OEAggregateDesc& TransRsDesc() {
+    static const std::vector<OETagRow> valid = [] {
+        std::vector<OETagRow> rows = {{OETAG_TRNUID, OEVM_ALL, 0},
+                                      {OETAG_STATUS, OEVM_ALL, 0},
+                                      {OETAG_CLTCOOKIE, OEVM_ALL, 0},
+                                      {OETAG_WARNING, OEVM_ALL, 0}};
+        for (const InnerRow& r : kInner)
+            if (OETagID rs = OEResponseTagOf(r.m_inner)) rows.push_back(OETagRow{rs, OEVM_ALL, 0});
+        return rows;
+    }();
+    static const OEAggregateDesc desc = WrapperDesc(valid, kTransRsRequired, kTransRsFields);
+    return desc;
+}
 const OEAggregateDesc kStatusDesc = OE_DESC(OETAG_STATUS, kStatusValid, kStatusRequired, kStatusFields);
 const OEAggregateDesc kWarningDesc = OE_DESC(OETAG_WARNING, kWarningValid, kWarningValid, kWarningFields);
 const OEAggregateDesc kSyncRqDesc = OE_DESC(OETAG_NONE, kSyncRqValid, kSyncRqRequired, kSyncRqFields);
@@ -357,7 +386,7 @@ const OEAggregateDesc& OEWarning::Describe() const { return kWarningDesc; }
 // ---------------------------------------------------------------- OETransRq
 
 OETransRq::OETransRq(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRq::Describe() const { return kTransRqDesc; }
+const OEAggregateDesc& OETransRq::Describe() const { return TransRqDesc(); }
 
 OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
     for (const InnerRow& r : kInner)
@@ -408,7 +437,7 @@ unsigned short OETransRq::AllRequiredPresent() {
 // ---------------------------------------------------------------- OETransRs
 
 OETransRs::OETransRs(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRs::Describe() const { return kTransRsDesc; }
+const OEAggregateDesc& OETransRs::Describe() const { return TransRsDesc(); }
 
 unsigned short OETransRs::SetActualTrans(OETransBase* inner) {
     if (!inner) return SetChildObj(OETAG_STMTRS, nullptr);
