@@ -55,7 +55,7 @@ void OEBuilder::Put(const char* text, unsigned long length) {
 void OEBuilder::Put(const char* text) { Put(text, std::strlen(text)); }
 
 const char* OEBuilder::TagText(OETagID tag) const {
-    if (!m_dictionary || tag == 0) return nullptr;
+    if (!m_dictionary || tag == 0 || tag > NumberOfOEDictionaryEntry()) return nullptr;
     const char* name = m_dictionary->GetTagString(tag);
     return name && *name ? name : nullptr;
 }
