@@ -255,35 +255,28 @@ unsigned short OEFileOFX::ValidateHeaders() {
         }
         OEString value(*stored);
         value.MakeUpper();
-        const char* v = value.c_str();
         bool bad = false, fatal = false;
         switch (tag) {
         case OEHT_OFXHEADER:
             bad = value != "100";
             break;
-        case OEHT_DATA: {
-            OEOFXData d;
-            fatal = bad = !OEDataConversion::StringToOFXData(v, d);
+        // The keyword tables of the header enumerations, compared here so that each fault is
+        // reported once (the conversions report a refused word themselves).
+        case OEHT_DATA:
+            fatal = bad = value != "OFXSGML";
             break;
-        }
         case OEHT_VERSION:
             bad = value != "102" && value != "103" && value != "151";
             break;
-        case OEHT_ENCODING: {
-            OEOFXEncoding e;
-            fatal = bad = !OEDataConversion::StringToOFXEncoding(v, e);
+        case OEHT_ENCODING:
+            fatal = bad = value != "USASCII" && value != "UTF-8";
             break;
-        }
-        case OEHT_CHARSET: {
-            OEOFXCharSet c;
-            bad = !OEDataConversion::StringToOFXCharSet(v, c);
+        case OEHT_CHARSET:
+            bad = value != "1252";
             break;
-        }
-        case OEHT_COMPRESSION: {
-            OEOFXCompression c;
-            fatal = bad = !OEDataConversion::StringToOFXCompression(v, c);
+        case OEHT_COMPRESSION:
+            fatal = bad = value != "NONE";
             break;
-        }
         default:
             break;
         }
