@@ -9,7 +9,9 @@
 
 namespace {
 
-OETagRow R(OETagID tag, unsigned short mask = OEVM_ALL) { return OETagRow{tag, mask, 0}; }
+OETagRow R(OETagID tag, unsigned short mask = OEVM_ALL) {
+    return OETagRow{tag, mask, 0};
+}
 
 // Valid rows: NAME, a version-2-only DESC, VALUE, a not-version-1 DTASOF, then 70 filler rows so
 // that BALTYPE (row 74) and CURRENCY (row 75) sit in the third word.
@@ -28,7 +30,8 @@ public:
     }
     static const std::vector<OETagRow>& Valid() {
         static const std::vector<OETagRow> rows = [] {
-            std::vector<OETagRow> v = {R(OETAG_NAME), R(OETAG_DESC, OEVM_V2), R(OETAG_VALUE), R(OETAG_DTASOF, OEVM_NOTV1)};
+            std::vector<OETagRow> v = {R(OETAG_NAME), R(OETAG_DESC, OEVM_V2), R(OETAG_VALUE),
+                                       R(OETAG_DTASOF, OEVM_NOTV1)};
             for (unsigned id = 1000; v.size() < 74; ++id) v.push_back(R(static_cast<OETagID>(id)));
             v.push_back(R(OETAG_BALTYPE));
             v.push_back(R(OETAG_CURRENCY));
@@ -208,8 +211,8 @@ TEST(DataObjFactory, InstallationAndOwnership) {
     EXPECT_EQ(FactoryStatics::Installed(), nullptr);
 
     OEDataObjFactory host(2);
-    OEDataObj::GetFactory();                      // a library-owned default again...
-    EXPECT_EQ(OEDataObj::SetFactory(&host), 1);   // ...deleted here (the sanitizer build checks once)
+    OEDataObj::GetFactory();                    // a library-owned default again...
+    EXPECT_EQ(OEDataObj::SetFactory(&host), 1); // ...deleted here (the sanitizer build checks once)
     EXPECT_EQ(OEDataObj::GetFactory(), &host);
     EXPECT_EQ(FactoryStatics::Owned(), 0);
     OEDataObjFactory other(1);
