@@ -143,7 +143,7 @@ OEDateTimeBase& OEDateTimeBase::operator=(const char* text) {
 void OEDateTimeBase::Invalidate() {
     m_year = m_month = m_day = m_hour = m_minute = m_second = m_millisecond = 0;
     m_tzHours = m_tzFraction = 0;
-    if (!m_tzName.IsEmpty()) m_tzName = "";
+    m_tzName.Truncate(0); // keeps the buffer for the next name
 }
 
 unsigned short OEDateTimeBase::IsLeapYear(unsigned short year) {
@@ -185,7 +185,7 @@ unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short 
 }
 
 unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short fraction, const char* whole) {
-    m_tzName = name ? name : "";
+    m_tzName.Assign(name, static_cast<unsigned short>(name ? std::strlen(name) : 0));
     m_tzHours = hours;
     m_tzFraction = fraction;
     if (hours <= -4 && hours >= -8 && fraction == 0 && !m_tzName.IsEmpty()) {

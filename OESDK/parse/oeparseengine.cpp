@@ -6,6 +6,12 @@
 
 #include <cstdint>
 #include <cstring>
+#include <initializer_list>
+
+#if defined(__SSE2__)
+#include <emmintrin.h>
+#define OESDK_SCAN_SSE2 1
+#endif
 
 namespace {
 
@@ -17,11 +23,69 @@ inline char Upper(char c) {
     return (c >= 'a' && c <= 'z') ? static_cast<char>(c - 'a' + 'A') : c;
 }
 
+inline bool SameBytes(const char* a, const char* b, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i)
+        if (a[i] != b[i]) return false;
+    return true;
+}
+
 inline bool EqualsIgnoringCase(const char* a, const char* b, std::size_t n) {
     for (std::size_t i = 0; i < n; ++i)
         if (Upper(a[i]) != Upper(b[i])) return false;
     return true;
 }
+
+// Word-at-a-time helpers (the library targets little-endian x86-64 only).
+inline std::uint64_t Load8(const char* p) {
+    std::uint64_t w;
+    std::memcpy(&w, p, 8);
+    return w;
+}
+const std::uint64_t kOnes = 0x0101010101010101ull;
+const std::uint64_t kHighs = 0x8080808080808080ull;
+// High bit set in the bytes of w equal to c; the lowest set byte is always a true match.
+inline std::uint64_t BytesEqual(std::uint64_t w, unsigned char c) {
+    const std::uint64_t x = w ^ (kOnes * c);
+    return (x - kOnes) & ~x & kHighs;
+}
+inline unsigned FirstByte(std::uint64_t mask) {
+    return static_cast<unsigned>(__builtin_ctzll(mask)) >> 3;
+}
+
+// Characters that end a tag name in the scanner's fast path.
+struct NameStopTable {
+    bool m_stop[256];
+    NameStopTable() : m_stop{} {
+        for (unsigned char c : {'>', '<', '/', ' ', '\n', '\r', '\t'}) m_stop[c] = true;
+    }
+};
+const NameStopTable kNameStop;
+
+// A tag name reduced to two words and its length: its first 8 bytes (zero-padded) and its last 8
+// bytes (0 for names of up to 8). Names of up to 16 bytes are equal exactly when their keys are.
+struct NameKey {
+    std::uint64_t m_first;
+    std::uint64_t m_last;
+    std::size_t m_length;
+
+    // `canOverRead`: 8 bytes from `name` may be read even when the name is shorter.
+    NameKey(const char* name, std::size_t length, bool canOverRead)
+        : m_first(0), m_last(0), m_length(length) {
+        if (length >= 8) {
+            m_first = Load8(name);
+            m_last = Load8(name + length - 8);
+        } else if (canOverRead) {
+            m_first = Load8(name) & ((std::uint64_t(1) << (8 * length)) - 1);
+        } else {
+            for (std::size_t i = 0; i < length; ++i)
+                m_first |= std::uint64_t(static_cast<unsigned char>(name[i])) << (8 * i);
+        }
+    }
+    std::uint32_t Hash() const {
+        std::uint64_t h = (m_first * 0x9E3779B97F4A7C15ull) ^ (m_last * 0xC2B2AE3D27D4EB4Full) ^ m_length;
+        return static_cast<std::uint32_t>(h >> 32) ^ static_cast<std::uint32_t>(h);
+    }
+};
 
 // Exact-name index over the built-in tag table: one hash probe per tag instead of a binary
 // search through the dictionary's comparison objects. It answers exactly what the dictionary's
@@ -36,39 +100,44 @@ public:
             const char* name = table[i].m_name;
             if (!name || !*name) continue;
             std::size_t length = std::strlen(name);
-            std::uint32_t slot = Hash(name, length) & kMask;
-            while (m_slots[slot]) slot = (slot + 1) & kMask;
-            m_slots[slot] = &table[i];
-            m_lengths[slot] = static_cast<unsigned short>(length);
+            char padded[80] = {};
+            if (length >= sizeof padded - 8) continue; // no such tag: the longest has 37 characters
+            std::memcpy(padded, name, length);
+            NameKey key(padded, length, true);
+            std::uint32_t slot = key.Hash() & kMask;
+            while (m_slots[slot].m_entry) slot = (slot + 1) & kMask;
+            m_slots[slot] = Slot{&table[i], key.m_first, key.m_last, static_cast<unsigned short>(length)};
         }
     }
 
-    const OETagDictionaryEntry* Find(const char* name, std::size_t length) const {
-        std::uint32_t slot = Hash(name, length) & kMask;
-        while (const OETagDictionaryEntry* entry = m_slots[slot]) {
-            if (m_lengths[slot] == length && std::memcmp(entry->m_name, name, length) == 0) return entry;
-            slot = (slot + 1) & kMask;
+    const OETagDictionaryEntry* Find(const char* name, std::size_t length, bool canOverRead) const {
+        const NameKey key(name, length, canOverRead);
+        for (std::uint32_t slot = key.Hash() & kMask;; slot = (slot + 1) & kMask) {
+            const Slot& s = m_slots[slot];
+            if (!s.m_entry) return nullptr;
+            if (s.m_length == length && s.m_first == key.m_first && s.m_last == key.m_last &&
+                (length <= 16 || std::memcmp(s.m_entry->m_name + 8, name + 8, length - 16) == 0))
+                return s.m_entry;
         }
-        return nullptr;
     }
 
 private:
     enum : std::uint32_t { kSize = 4096, kMask = kSize - 1 };
-
-    static std::uint32_t Hash(const char* p, std::size_t n) {
-        std::uint32_t h = 2166136261u;
-        for (std::size_t i = 0; i < n; ++i) h = (h ^ static_cast<unsigned char>(p[i])) * 16777619u;
-        return h ^ (h >> 15);
-    }
-
-    const OETagDictionaryEntry* m_slots[kSize];
-    unsigned short m_lengths[kSize] = {};
+    struct Slot {
+        const OETagDictionaryEntry* m_entry;
+        std::uint64_t m_first;
+        std::uint64_t m_last;
+        unsigned short m_length;
+    };
+    Slot m_slots[kSize];
 };
 
 const NameIndex& TheNameIndex() {
     static const NameIndex index; // built once, thread-safely
     return index;
 }
+
+const NameIndex* g_nameIndex = nullptr; // set by every engine's constructor (always the same index)
 
 // The OFX header names (the keyword table of the header conversion), matched ignoring case.
 // CONTENT-TYPE and CONTENT-LENGTH have no keyword: they come back as OEHT_UNKNOWN, with their
@@ -94,16 +163,15 @@ OEParseEngine::OEParseEngine(OEBuffer* buffer)
       m_data(buffer ? buffer->GetBufferPtr() : nullptr),
       m_size(buffer && m_data ? buffer->GetBufferSize() : 0), m_haveLookAhead(false), m_pos(0),
       m_headerPos(0), m_piPos(0), m_piEnd(0), m_headersDone(false), m_lastStartEmpty(false) {
-    m_current.m_kind = kRawEnd;
     m_lookAhead.m_kind = kRawEnd;
     const void* lt = m_size ? std::memchr(m_data, '<', m_size) : nullptr;
     m_pos = lt ? static_cast<unsigned long>(static_cast<const char*>(lt) - m_data) : m_size;
-    TheNameIndex();
+    g_nameIndex = &TheNameIndex();
 }
 
 OEParseEngine::~OEParseEngine() {}
 
-void OEParseEngine::SyncOffset(unsigned long pos) {
+inline void OEParseEngine::SyncOffset(unsigned long pos) {
     if (m_buffer) m_buffer->SetBufferOffset(pos);
 }
 
@@ -114,9 +182,27 @@ void OEParseEngine::LogAt(unsigned long pos, int code, const char* text, unsigne
     OELogParseWarning(static_cast<OEParseWarning>(code), copy.c_str(), nullptr, tag);
 }
 
+namespace {
+const OETagDictionaryEntry* ResolveSlow(const char* name, unsigned short length);
+} // namespace
+
+inline const OETagDictionaryEntry* OEParseEngine::Resolve(const RawToken& token) {
+    const char* name = m_data + token.m_start;
+    const unsigned short length = static_cast<unsigned short>(token.m_length);
+    if (const OETagDictionaryEntry* entry = g_nameIndex->Find(name, length, token.m_start + 8 <= m_size))
+        return entry;
+    return ResolveSlow(name, length);
+}
+
 const OETagDictionaryEntry* OEParseEngine::ResolveTagName(const char* name, unsigned short length) {
     if (!name || !length) return nullptr;
-    if (const OETagDictionaryEntry* entry = TheNameIndex().Find(name, length)) return entry;
+    if (const OETagDictionaryEntry* entry = TheNameIndex().Find(name, length, false)) return entry;
+    return ResolveSlow(name, length);
+}
+
+namespace {
+// Not found as written: a name with a lower-case letter is looked up again ignoring case.
+const OETagDictionaryEntry* ResolveSlow(const char* name, unsigned short length) {
     bool hasLower = false;
     for (unsigned short i = 0; i < length && !hasLower; ++i) hasLower = name[i] >= 'a' && name[i] <= 'z';
     if (!hasLower) return nullptr;
@@ -130,6 +216,7 @@ const OETagDictionaryEntry* OEParseEngine::ResolveTagName(const char* name, unsi
     }
     return entry;
 }
+} // namespace
 
 // ---------------------------------------------------------------------------------------------
 // Header lines
@@ -268,9 +355,88 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     token.m_length = nameEnd - nameStart;
 }
 
+// The hot path of the scanner: whitespace, a text, or a plain "<NAME>" / "</NAME>" tag.
+// Everything else (comments, CDATA, odd or broken tags, short tails) goes to ScanRaw.
+#if defined(__GNUC__)
+#define OE_ALWAYS_INLINE inline __attribute__((always_inline))
+#else
+#define OE_ALWAYS_INLINE inline
+#endif
+
+OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
+#ifdef OESDK_SCAN_SSE2
+    const char* base = m_data;
+    unsigned long p = m_pos;
+    while (p < m_size && IsSpace(base[p])) ++p;
+    if (p + 17 > m_size) return ScanRaw(token);
+    if (base[p] != '<') {
+        unsigned long end = p;
+        unsigned amp = 0, nul = 0;
+        for (;;) {
+            if (end + 16 > m_size) return ScanRaw(token);
+            const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + end));
+            const unsigned lt =
+                static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('<'))));
+            const unsigned am =
+                static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('&'))));
+            const unsigned zero =
+                static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_setzero_si128())));
+            if (lt) {
+                const unsigned i = static_cast<unsigned>(__builtin_ctz(lt));
+                const unsigned below = (1u << i) - 1;
+                amp |= am & below;
+                nul |= zero & below;
+                end += i;
+                break;
+            }
+            amp |= am;
+            nul |= zero;
+            end += 16;
+        }
+        unsigned long last = end;
+        while (last > p && IsSpace(base[last - 1])) --last;
+        token.m_kind = kRawText;
+        token.m_tagStart = token.m_start = p;
+        token.m_length = last - p;
+        token.m_next = end;
+        token.m_hasAmp = amp ? 1 : 0;
+        token.m_hasNul = nul != 0;
+        return;
+    }
+    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
+    const unsigned gt = static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
+    if (gt) {
+        __m128i stop =
+            _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
+        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
+        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
+        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
+        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
+        const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
+        const bool endTag = base[p + 1] == '/';
+        const unsigned from = endTag ? 1u : 0u;
+        const unsigned before = static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
+        const char first = base[p + 1 + from];
+        if (!before && i > from && first != '!' && first != '?') {
+            token.m_kind = endTag ? kRawEndTag : kRawStart;
+            token.m_tagStart = p;
+            token.m_start = p + 1 + from;
+            token.m_length = i - from;
+            token.m_next = p + 2 + i;
+            token.m_hasAmp = -1;
+            token.m_hasNul = false;
+            return;
+        }
+    }
+#endif
+    ScanRaw(token);
+}
+
 void OEParseEngine::ScanRaw(RawToken& token) {
     const char* base = m_data;
     unsigned long p = m_pos;
+    token.m_hasAmp = -1;
+    token.m_hasNul = true; // not looked at: the copy checks
     for (;;) {
         while (p < m_size && IsSpace(base[p])) ++p;
         if (p >= m_size) {
@@ -280,16 +446,106 @@ void OEParseEngine::ScanRaw(RawToken& token) {
             return;
         }
         if (base[p] != '<') {
-            // Text runs to the next "<"; trailing whitespace is not part of it.
-            const void* lt = std::memchr(base + p, '<', m_size - p);
-            unsigned long end = lt ? static_cast<unsigned long>(static_cast<const char*>(lt) - base) : m_size;
+            // Text runs to the next "<"; trailing whitespace is not part of it. Eight bytes at a
+            // time, noting on the way whether the text holds an "&" to decode.
+            unsigned long end = p;
+            signed char amp = 0;
+            for (;;) {
+#ifdef OESDK_SCAN_SSE2
+                if (end + 16 <= m_size) {
+                    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + end));
+                    const unsigned lt =
+                        static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('<'))));
+                    const unsigned am =
+                        static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('&'))));
+                    if (lt) {
+                        const unsigned i = static_cast<unsigned>(__builtin_ctz(lt));
+                        if (am & ((1u << i) - 1)) amp = 1;
+                        end += i;
+                        break;
+                    }
+                    if (am) amp = 1;
+                    end += 16;
+                    continue;
+                }
+#endif
+                if (end + 8 > m_size) {
+                    while (end < m_size && base[end] != '<') {
+                        if (base[end] == '&') amp = 1;
+                        ++end;
+                    }
+                    break;
+                }
+                const std::uint64_t w = Load8(base + end);
+                const std::uint64_t lt = BytesEqual(w, '<');
+                const std::uint64_t am = BytesEqual(w, '&');
+                if (lt) {
+                    const unsigned i = FirstByte(lt);
+                    if (am && FirstByte(am) < i) amp = 1;
+                    end += i;
+                    break;
+                }
+                if (am) amp = 1;
+                end += 8;
+            }
             unsigned long last = end;
             while (last > p && IsSpace(base[last - 1])) --last;
             token.m_kind = kRawText;
             token.m_tagStart = token.m_start = p;
             token.m_length = last - p;
             token.m_next = end;
+            token.m_hasAmp = amp;
             return;
+        }
+        {
+            // The common tag, "<NAME>" or "</NAME>".
+#ifdef OESDK_SCAN_SSE2
+            if (p + 17 <= m_size) {
+                // Sixteen bytes after the "<" at once: the first ">" and anything that would end
+                // the name before it.
+                const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
+                const unsigned gt =
+                    static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
+                if (gt) {
+                    __m128i stop = _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')),
+                                                _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
+                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
+                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
+                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
+                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
+                    const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
+                    const bool endTag = base[p + 1] == '/';
+                    const unsigned from = endTag ? 1u : 0u;
+                    const unsigned before =
+                        static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
+                    const char first = base[p + 1 + from];
+                    if (!before && i > from && first != '!' && first != '?') {
+                        token.m_kind = endTag ? kRawEndTag : kRawStart;
+                        token.m_tagStart = p;
+                        token.m_start = p + 1 + from;
+                        token.m_length = i - from;
+                        token.m_next = p + 2 + i;
+                        token.m_hasAmp = -1;
+                        return;
+                    }
+                }
+            }
+#endif
+            unsigned long r = p + 1;
+            const bool endTag = r < m_size && base[r] == '/';
+            if (endTag) ++r;
+            const unsigned long nameStart = r;
+            if (r < m_size && base[r] != '!' && base[r] != '?') {
+                while (r < m_size && !kNameStop.m_stop[static_cast<unsigned char>(base[r])]) ++r;
+                if (r < m_size && base[r] == '>' && r > nameStart) {
+                    token.m_kind = endTag ? kRawEndTag : kRawStart;
+                    token.m_tagStart = p;
+                    token.m_start = nameStart;
+                    token.m_length = r - nameStart;
+                    token.m_next = r + 1;
+                    return;
+                }
+            }
         }
         unsigned long q = p + 1;
         while (q < m_size && IsSpace(base[q])) ++q;
@@ -345,9 +601,37 @@ void OEParseEngine::ScanRaw(RawToken& token) {
 // ---------------------------------------------------------------------------------------------
 // Tokens
 
-unsigned short OEParseEngine::ReadText(const RawToken& token) {
-    AssignRange(m_value, m_data + token.m_start, token.m_length);
-    if (token.m_kind == kRawText && m_value.GetStrLength() &&
+inline unsigned short OEParseEngine::ValueText::SetRaw(const char* text, unsigned long n, bool canOverRead) {
+    if (n > kMaxLength) n = kMaxLength;
+    // At least 32 bytes, so that a short value is copied in one 16-byte move.
+    const unsigned long size = n + 1 < 32 ? 32 : n + 1;
+    if (size > m_bufferSize && !AllocStringBuffer(static_cast<unsigned short>(size))) return 0;
+#ifdef OESDK_SCAN_SSE2
+    if (n <= 16 && canOverRead) {
+        _mm_storeu_si128(reinterpret_cast<__m128i*>(m_buffer),
+                         _mm_loadu_si128(reinterpret_cast<const __m128i*>(text)));
+    } else if (n >= 16 && n <= 32) {
+        // Two overlapping moves cover 16 to 32 bytes (the buffer holds at least 32).
+        const __m128i head = _mm_loadu_si128(reinterpret_cast<const __m128i*>(text));
+        const __m128i tail = _mm_loadu_si128(reinterpret_cast<const __m128i*>(text + n - 16));
+        _mm_storeu_si128(reinterpret_cast<__m128i*>(m_buffer), head);
+        _mm_storeu_si128(reinterpret_cast<__m128i*>(m_buffer + n - 16), tail);
+    } else
+#endif
+        std::memcpy(m_buffer, text, n);
+    (void)canOverRead;
+    m_buffer[n] = 0;
+    m_length = static_cast<unsigned short>(n);
+    return 1;
+}
+
+inline unsigned short OEParseEngine::ReadText(const RawToken& token) {
+    if (token.m_hasNul) {
+        AssignRange(m_value, m_data + token.m_start, token.m_length);
+    } else if (!m_value.SetRaw(m_data + token.m_start, token.m_length, token.m_start + 16 <= m_size)) {
+        return 0;
+    }
+    if (token.m_kind == kRawText && token.m_hasAmp != 0 && m_value.GetStrLength() &&
         std::memchr(m_value.c_str(), '&', m_value.GetStrLength())) {
         unsigned short length = m_value.GetStrLength();
         char* p = m_value.LockBuffer(m_value.BufferSize());
@@ -369,9 +653,9 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
             token = m_lookAhead;
             m_haveLookAhead = false;
         } else {
-            ScanRaw(token);
+            ScanFast(token);
         }
-        m_current = token;
+        m_tokenStart = token.m_tagStart;
         m_pos = token.m_next;
         SyncOffset(token.m_tagStart);
         const char* name = m_data + token.m_start;
@@ -394,15 +678,15 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
 
         case kRawEndTag: {
             if (m_elementEntry && nameLength == m_elementNameLength &&
-                std::memcmp(name, m_data + m_elementNameStart, nameLength) == 0) {
+                SameBytes(name, m_data + m_elementNameStart, nameLength)) {
                 entry = m_elementEntry;
                 m_elementEntry = nullptr;
                 return OETK_ENDTAG;
             }
             m_elementEntry = nullptr;
-            entry = ResolveTagName(name, nameLength);
+            entry = Resolve(token);
             if (entry) {
-                m_unknownElement.Assign("", 0);
+                if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
                 return OETK_ENDTAG;
             }
             // The end tag of an unknown element was logged with its start tag.
@@ -417,7 +701,7 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
 
         case kRawEmpty: {
             // "<MEMO/>": an element without a value.
-            const OETagDictionaryEntry* e = ResolveTagName(name, nameLength);
+            const OETagDictionaryEntry* e = Resolve(token);
             LogAt(token.m_tagStart, e ? OEPW_EMPTYELEM : OEPW_UNKNOWNTAG, name, nameLength,
                   e ? e->m_id : OETAG_NONE);
             continue;
@@ -425,16 +709,16 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
 
         default: { // kRawStart: an element when text follows, an aggregate when a tag does
             RawToken next;
-            ScanRaw(next);
+            ScanFast(next);
             if (next.m_kind == kRawText || next.m_kind == kRawCData) {
                 m_pos = next.m_next;
-                entry = ResolveTagName(name, nameLength);
+                entry = Resolve(token);
                 if (!entry) {
                     LogAt(token.m_tagStart, OEPW_UNKNOWNTAG, name, nameLength);
                     AssignRange(m_unknownElement, name, nameLength);
                     continue;
                 }
-                m_unknownElement.Assign("", 0);
+                if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
                 m_elementEntry = entry;
                 m_elementNameStart = token.m_start;
                 m_elementNameLength = nameLength;
@@ -446,8 +730,8 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
             m_haveLookAhead = true;
             m_lastStartEmpty = next.m_kind == kRawEndTag && next.m_length == token.m_length &&
                                EqualsIgnoringCase(m_data + next.m_start, name, nameLength);
-            entry = ResolveTagName(name, nameLength);
-            m_unknownElement.Assign("", 0);
+            entry = Resolve(token);
+            if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
             if (entry) return OETK_AGGSTART;
             // An unknown aggregate is skipped whole.
             LogAt(token.m_tagStart, OEPW_UNKNOWNTAG, name, nameLength);
@@ -485,6 +769,6 @@ unsigned short OEParseEngine::SkipAggregate(const char* name) {
         m_lastStartEmpty = false;
         return 1;
     }
-    LogAt(m_current.m_tagStart, OEPW_SKIPFAILED, name ? name : "", length);
+    LogAt(m_tokenStart, OEPW_SKIPFAILED, name ? name : "", length);
     return 0;
 }

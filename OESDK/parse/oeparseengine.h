@@ -14,7 +14,16 @@
 #include "tags/oeheadertag.h"
 #include "tags/oetagdictionary.h"
 
+#include <cstdint>
+
 class OEBuffer;
+
+// The scanner's private steps stay out of the export table (and out of the PLT on ELF).
+#if defined(_WIN32)
+#define OE_INTERNAL
+#else
+#define OE_INTERNAL __attribute__((visibility("hidden")))
+#endif
 
 enum OETokenKind {
     OETK_ERROR = -1,    // malformed tag, or text where a tag was expected
@@ -70,25 +79,37 @@ public:
 private:
     enum RawKind { kRawEnd, kRawText, kRawCData, kRawStart, kRawEndTag, kRawBad, kRawEmpty };
     struct RawToken {
-        int m_kind = kRawEnd;
-        unsigned long m_start = 0; // text, CDATA content, or tag name
-        unsigned long m_length = 0;
-        unsigned long m_tagStart = 0; // the "<" of a tag
-        unsigned long m_next = 0;     // where scanning goes on after this token
+        int m_kind;
+        unsigned long m_start; // text, CDATA content, or tag name
+        unsigned long m_length;
+        unsigned long m_tagStart; // the "<" of a tag
+        unsigned long m_next;     // where scanning goes on after this token
+        signed char m_hasAmp;     // text: 1 holds "&", 0 does not, -1 not looked at
+        bool m_hasNul;            // text: holds a 0 byte
+    };
+    // The value string, filled in one copy.
+    class ValueText : public OEString {
+    public:
+        // Copies n bytes that hold no 0 byte (16 may be read when canOverRead). Returns 1, or 0
+        // when memory is short.
+        unsigned short SetRaw(const char* text, unsigned long n, bool canOverRead);
     };
 
-    void ScanRaw(RawToken& token);
-    void ScanTag(unsigned long lt, RawToken& token);
-    unsigned short ReadText(const RawToken& token);
-    unsigned short NextPiHeader(OEHeaderTag& tag, OEString& name, OEString& value);
-    void LogAt(unsigned long pos, int code, const char* text, unsigned long length, OETagID tag = OETAG_NONE);
-    void SyncOffset(unsigned long pos);
+    OE_INTERNAL void ScanRaw(RawToken& token);
+    OE_INTERNAL void ScanFast(RawToken& token);
+    OE_INTERNAL const OETagDictionaryEntry* Resolve(const RawToken& token);
+    OE_INTERNAL void ScanTag(unsigned long lt, RawToken& token);
+    OE_INTERNAL unsigned short ReadText(const RawToken& token);
+    OE_INTERNAL unsigned short NextPiHeader(OEHeaderTag& tag, OEString& name, OEString& value);
+    OE_INTERNAL void LogAt(unsigned long pos, int code, const char* text, unsigned long length,
+                           OETagID tag = OETAG_NONE);
+    OE_INTERNAL void SyncOffset(unsigned long pos);
 
     OETagDictionary* m_dictionary;
     OEBuffer* m_buffer;
     const char* m_data;
     unsigned long m_size;
-    RawToken m_current;
+    unsigned long m_tokenStart; // where the token last returned starts
     RawToken m_lookAhead;
     bool m_haveLookAhead;
     unsigned long m_pos;
@@ -97,7 +118,7 @@ private:
     unsigned long m_piEnd;
     bool m_headersDone;
     bool m_lastStartEmpty;
-    OEString m_value;
+    ValueText m_value;
     OEString m_unknownElement;
     // The last element's name as written and its row: its XML-style end tag resolves to the
     // same row without a second lookup (and without logging a lower-case name twice).

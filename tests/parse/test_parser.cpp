@@ -11,6 +11,14 @@ using testagg::Parse;
 
 namespace {
 
+// A host factory for the whole program, so no default factory is left behind for the leak checker.
+OEDataObjFactory g_hostFactory(1);
+struct HostFactoryEnvironment : ::testing::Environment {
+    void SetUp() override { OEDataObj::SetFactory(&g_hostFactory); }
+    void TearDown() override { OEDataObj::SetFactory(nullptr); }
+};
+::testing::Environment* const g_environment = ::testing::AddGlobalTestEnvironment(new HostFactoryEnvironment);
+
 const char* const kSgml =
     "OFXHEADER:100\r\nDATA:OFXSGML\r\nVERSION:102\r\nCONTENT-TYPE: application/x-ofx\r\n\r\n"
     "<OFX>\n<SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</STATUS>\n"
