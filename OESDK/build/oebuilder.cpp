@@ -8,6 +8,7 @@
 #include <cstdio>
 #include <cstring>
 #include <string>
+#include <vector>
 
 const char OEBuilder::OE_NEW_LINE[] = "\n";
 
@@ -55,9 +56,20 @@ void OEBuilder::Put(const char* text, unsigned long length) {
 void OEBuilder::Put(const char* text) { Put(text, std::strlen(text)); }
 
 const char* OEBuilder::TagText(OETagID tag) const {
-    if (!m_dictionary || tag == 0 || tag > NumberOfOEDictionaryEntry()) return nullptr;
-    const char* name = m_dictionary->GetTagString(tag);
-    return name && *name ? name : nullptr;
+    // Every tag of the dictionary by id, looked up once for the process.
+    static const std::vector<const char*> names = [] {
+        std::vector<const char*> table;
+        OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+        unsigned n = NumberOfOEDictionaryEntry();
+        table.assign(n + 1, nullptr);
+        for (unsigned id = 1; d && id <= n; ++id) {
+            const char* name = d->GetTagString(static_cast<OETagID>(id));
+            table[id] = name && *name ? name : nullptr;
+        }
+        return table;
+    }();
+    if (!m_dictionary || tag == 0 || tag >= names.size()) return nullptr;
+    return names[tag];
 }
 
 OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringOpt stringOpt,

@@ -7,6 +7,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <new>
 #include <string>
 
 namespace {
@@ -49,6 +50,39 @@ bool ParseLong(const char* text, bool allowSign, long long& out) {
 } // namespace
 
 OEAggregate::OEAggregate(unsigned short version) : OEDataObj(version) {}
+
+const unsigned char* OEAggregateDesc::Bits() const {
+    const unsigned char* bits = m_bits.load(std::memory_order_acquire);
+    if (bits) return bits;
+    unsigned char* fresh = new (std::nothrow) unsigned char[m_fieldCount ? m_fieldCount : 1];
+    if (!fresh) return nullptr;
+    for (unsigned short i = 0; i < m_fieldCount; ++i) {
+        fresh[i] = 0xFF;
+        for (unsigned short k = 0; k < m_validCount && k < 96; ++k) {
+            if (m_valid[k].m_tag == m_fields[i].m_tag) {
+                fresh[i] = static_cast<unsigned char>(k);
+                break;
+            }
+        }
+    }
+    const unsigned char* expected = nullptr;
+    if (!m_bits.compare_exchange_strong(expected, fresh, std::memory_order_acq_rel)) {
+        delete[] fresh;  // another thread won; the tables live as long as the process
+        return expected;
+    }
+    return fresh;
+}
+
+unsigned short OEAggregate::RowPresent(unsigned short index) const {
+    const OEAggregateDesc& d = Describe();
+    const unsigned char* bits = d.Bits();
+    if (!bits) return ValidateTag(d.m_fields[index].m_tag);
+    unsigned k = bits[index];
+    if (k == 0xFF) return 0;
+    // A tag whose first row does not apply at this version may have a later row that does.
+    if (!(d.m_valid[k].m_versionMask & GetMsgSetVersion())) return ValidateTag(d.m_fields[index].m_tag);
+    return (GetPresentWord(static_cast<unsigned short>(k / 32)) >> (k % 32)) & 1u;
+}
 
 // Members own their children (OEOwnedChild, OEDataObjList), so they go with the members.
 OEAggregate::~OEAggregate() {}
@@ -367,13 +401,18 @@ OEBuildStatus OEAggregate::Fail(OEBuilder* builder, OEBuildStatus status) {
 }
 
 OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
+    if (row->m_kind != OEFK_LIST && !ValidateTag(row->m_tag)) return OEBS_OK;
+    return BuildPresentRow(builder, row);
+}
+
+OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow* row) {
     OETagID tag = row->m_tag;
     void* slot = Slot(row);
     OEBuildStatus status = OEBS_OK;
     switch (row->m_kind) {
     case OEFK_CHILD: {
         OEDataObj* child = *static_cast<OEDataObj**>(slot);
-        if (!child || child->GetType() != tag || !ValidateTag(tag)) return OEBS_OK;
+        if (!child || child->GetType() != tag) return OEBS_OK;
         return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
     }
     case OEFK_LIST: {
@@ -389,7 +428,6 @@ OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
     default:
         break;
     }
-    if (!ValidateTag(tag)) return OEBS_OK;
     switch (row->m_kind) {
     case OEFK_TEXT:
         status = builder->AddTagOEString(tag, *static_cast<const OEString*>(slot));
@@ -427,7 +465,10 @@ OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
 int OEAggregate::Build(OEBuilder* builder) {
     const OEAggregateDesc& d = Describe();
     for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
-        OEBuildStatus status = BuildRow(builder, &d.m_fields[i]);
+        const OEFieldRow* row = &d.m_fields[i];
+        // Absent rows are skipped here, by their presence bit, before any other work.
+        if (row->m_kind != OEFK_LIST && !RowPresent(i)) continue;
+        OEBuildStatus status = BuildPresentRow(builder, row);
         if (status != OEBS_OK) return status;
     }
     return OEBS_OK;

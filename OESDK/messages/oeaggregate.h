@@ -20,6 +20,8 @@
 #include "tags/oedataobj.h"
 #include "tags/oedatafactory.h"
 
+#include <atomic>
+
 class OEBuilder;
 
 // What a field row stores.
@@ -62,6 +64,10 @@ struct OEAggregateDesc {
     unsigned short m_requiredCount;
     const OEFieldRow* m_fields;  // in build order
     unsigned short m_fieldCount;
+    // Filled on first use: for each field row, the position of its tag in the valid table (its
+    // presence bit), or 0xFF. Lets Build test presence without searching the table per row.
+    mutable std::atomic<const unsigned char*> m_bits{nullptr};
+    const unsigned char* Bits() const;
 };
 
 // Address of a member of class C, as an OEFieldRow wants it.
@@ -155,6 +161,10 @@ protected:
     // Builds one row (element or child) when it is present; the generic Build calls it per row.
     // Subclasses that write something in between override Build and call this.
     OEBuildStatus BuildRow(OEBuilder* builder, const OEFieldRow* row);
+    // The same for a row already known to be present.
+    OEBuildStatus BuildPresentRow(OEBuilder* builder, const OEFieldRow* row);
+    // 1 when field row `index` of this class is present (the same answer as ValidateTag).
+    unsigned short RowPresent(unsigned short index) const;
     // Records this object as the failed one (if none is yet) and returns the status.
     OEBuildStatus Fail(OEBuilder* builder, OEBuildStatus status);
     // Creates a child for a start tag through the factory and pushes it (the protocol of
