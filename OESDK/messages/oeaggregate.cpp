@@ -184,17 +184,29 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
         SetTag(tag);
         return 1;
     }
+    // A value not yet present converts in place (its field is not read while unmarked); one that
+    // is present converts through a copy, so that a refused text leaves the old value.
     case OEFK_AMOUNT: {
-        OEPrecisionInteger value;
-        if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
-        *static_cast<OEPrecisionInteger*>(slot) = value;
+        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
+        if (!ValidateTag(tag)) {
+            if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
+        } else {
+            OEPrecisionInteger value;
+            if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
+            *field = value;
+        }
         SetTag(tag);
         return 1;
     }
     case OEFK_DATETIME: {
-        OEDateTime value;
-        if (!value.ConvertStringToOEDateTime(s)) break;
-        *static_cast<OEDateTime*>(slot) = value;
+        OEDateTime* field = static_cast<OEDateTime*>(slot);
+        if (!ValidateTag(tag)) {
+            if (!field->ConvertStringToOEDateTime(s)) break;
+        } else {
+            OEDateTime value;
+            if (!value.ConvertStringToOEDateTime(s)) break;
+            *field = value;
+        }
         SetTag(tag);
         return 1;
     }
