@@ -2,10 +2,24 @@
 # Installs the Debian 12 packages that building and testing OESDK needs (the list is
 # scripts/debian-packages.txt). Only packages that are not installed yet are fetched, so this is
 # cheap to run again. Runs apt-get as root, or through sudo for other users; never asks questions.
+#
+# usage: scripts/setup-debian.sh [--native]
+#   --native   only what the native build, its tests and the command-line tool need; without it,
+#              also the sanitizer toolchain, the MinGW-w64 cross compiler and wine
 set -euo pipefail
 
 here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd)
-mapfile -t packages < <(sed -e 's/#.*//' -e 's/[[:space:]]//g' "$here/debian-packages.txt" | grep -v '^$')
+case ${1:-} in
+"") sections='native|all' ;;
+--native) sections='native' ;;
+*)
+  echo "usage: scripts/setup-debian.sh [--native]" >&2
+  exit 2
+  ;;
+esac
+# Package names from the chosen [sections] of the list, comments and blank lines dropped.
+mapfile -t packages < <(sed -e 's/#.*//' -e 's/[[:space:]]//g' "$here/debian-packages.txt" |
+  awk -v want="^($sections)\$" '/^\[.*\]$/ { on = (substr($0, 2, length($0) - 2) ~ want); next } on && NF')
 
 missing=()
 for p in "${packages[@]}"; do

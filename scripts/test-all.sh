@@ -3,8 +3,8 @@
 #   linux     native g++ Release; also builds the benchmarks and smoke-runs each one, checks that
 #             liboesdk.so exports only OE_API symbols, and installs the tree and builds two tiny
 #             consumers against the installation (find_package and pkg-config)
-#   sanitize  native clang with AddressSanitizer + UndefinedBehaviorSanitizer, every report fatal,
-#             leak detection on
+#   sanitize  native clang debug build (-O1, assertions on) with AddressSanitizer +
+#             UndefinedBehaviorSanitizer, every report fatal, leak detection on
 #   windows   the x86-64 DLL cross-built with MinGW-w64 (posix threads, static runtime); every test
 #             executable runs under wine through ctest; checks the DLL's imports and exports
 # All three build with -DOESDK_WERROR=ON. Missing Debian packages are installed first
@@ -130,8 +130,8 @@ leg_sanitize() {
   local b=$out/sanitize cxx=${OESDK_SANITIZE_CXX:-clang++} symbolizer
   fresh "$b"
   step "sanitize: configure ($cxx)" "$logs/sanitize-configure.log" \
-    env CXX="$cxx" cmake -S . -B "$b" -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo -DOESDK_WERROR=ON \
-    -DOESDK_SANITIZE=ON -DOESDK_BUILD_BENCH=OFF || return
+    env CXX="$cxx" cmake -S . -B "$b" -G Ninja -DCMAKE_BUILD_TYPE=Debug -DCMAKE_CXX_FLAGS_DEBUG="-O1 -g" \
+    -DOESDK_WERROR=ON -DOESDK_SANITIZE=ON -DOESDK_BUILD_BENCH=OFF || return
   step "sanitize: build (-j$jobs)" "$logs/sanitize-build.log" cmake --build "$b" -j"$jobs" || return
   symbolizer=$(command -v llvm-symbolizer-14 || command -v llvm-symbolizer || true)
   # Every report ends the test with a failure; leaks are reported at exit.
