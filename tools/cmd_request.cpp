@@ -73,6 +73,7 @@ int Statement(int argc, char** argv) {
     std::unique_ptr<OEFileRq> file(f->NewFileRq(1));
     OERequest* request = f->NewRequest(1);
     if (!file || !request || !file->AppendRequest(request)) return Fail("out of memory");
+    file->AddDefaultOFXHeaders(1);
 
     // Sign-on.
     OEMessageSetRq* signOnSet = f->NewMessageSetRq(1);
