@@ -54,5 +54,6 @@
 #include "messages/oesignon.h"
 #include "messages/oemsgset.h"
 #include "messages/oebank.h"
+#include "messages/oeprofile.h"
 
 #endif

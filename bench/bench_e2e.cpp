@@ -24,7 +24,8 @@ const int kTransactions = 20000;
 
 size_t CountTransactions(const std::string& text) {
     size_t n = 0;
-    for (size_t at = text.find("<STMTTRN>"); at != std::string::npos; at = text.find("<STMTTRN>", at + 1)) ++n;
+    for (size_t at = text.find("<STMTTRN>"); at != std::string::npos; at = text.find("<STMTTRN>", at + 1))
+        ++n;
     return n;
 }
 
@@ -75,7 +76,7 @@ void ParseToTree(benchmark::State& state, OFXForm form) {
         if (status != OEPS_OK) state.SkipWithError("parse failed");
         heapAfter = LiveHeap();
         benchmark::DoNotOptimize(file.get());
-        state.PauseTiming();  // freeing the tree is not part of parsing it
+        state.PauseTiming(); // freeing the tree is not part of parsing it
         file.reset();
         state.ResumeTiming();
     }
@@ -84,7 +85,8 @@ void ParseToTree(benchmark::State& state, OFXForm form) {
     state.counters["transactions"] = static_cast<double>(CountTransactions(text));
     if (heapAfter)
         state.counters["heap_x_file"] =
-            static_cast<double>(heapAfter - heapBefore + buffer->GetBufferAllocation()) / static_cast<double>(text.size());
+            static_cast<double>(heapAfter - heapBefore + buffer->GetBufferAllocation()) /
+            static_cast<double>(text.size());
 }
 
 void BuildToText(benchmark::State& state, OFXForm form) {
@@ -100,7 +102,8 @@ void BuildToText(benchmark::State& state, OFXForm form) {
     for (auto _ : state) {
         OEBuffer out(static_cast<unsigned long>(text.size() + 65536), 1 << 20);
         OEBuilder builder(OEBCL_CRLF, form == OFXForm::XML ? 1 : 0);
-        if (builder.Build(&out, file.get(), OEBSO_LENIENT, 0, 0) != OEBS_OK) state.SkipWithError("build failed");
+        if (builder.Build(&out, file.get(), OEBSO_LENIENT, 0, 0) != OEBS_OK)
+            state.SkipWithError("build failed");
         written = out.GetBufferSize();
         benchmark::DoNotOptimize(out.GetBufferPtr());
     }

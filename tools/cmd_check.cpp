@@ -19,7 +19,8 @@ int Run(int argc, char** argv) {
     }
     int errors = 0, warnings = 0;
     if (doc.status != OEPS_OK && doc.status != OEPS_WARNINGS) {
-        std::printf("%s: error: parsing stopped with status %d\n", doc.path.c_str(), static_cast<int>(doc.status));
+        std::printf("%s: error: parsing stopped with status %d\n", doc.path.c_str(),
+                    static_cast<int>(doc.status));
         ++errors;
     }
     if (!doc.headersAcceptable) {
@@ -59,5 +60,5 @@ int Run(int argc, char** argv) {
 
 } // namespace
 
-OE_TOOL_COMMAND(check, "check", "FILE", "parse with the required-element check: exit 0 clean, 1 warnings, 2 errors",
-                Run);
+OE_TOOL_COMMAND(check, "check", "FILE",
+                "parse with the required-element check: exit 0 clean, 1 warnings, 2 errors", Run);

@@ -34,8 +34,8 @@ int Run(int argc, char** argv) {
         return 3;
     }
     if (doc.status != OEPS_OK && doc.status != OEPS_WARNINGS) {
-        std::fprintf(stderr, "oesdk convert: %s did not parse (status %d); run 'oesdk check' for details\n", path,
-                     static_cast<int>(doc.status));
+        std::fprintf(stderr, "oesdk convert: %s did not parse (status %d); run 'oesdk check' for details\n",
+                     path, static_cast<int>(doc.status));
         return 1;
     }
     std::string text;

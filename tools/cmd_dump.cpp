@@ -62,5 +62,5 @@ int Run(int argc, char** argv) {
 
 } // namespace
 
-OE_TOOL_COMMAND(dump, "dump", "FILE", "parse a file and print its headers, typed tree, parse status and irregularities",
-                Run);
+OE_TOOL_COMMAND(dump, "dump", "FILE",
+                "parse a file and print its headers, typed tree, parse status and irregularities", Run);

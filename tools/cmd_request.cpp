@@ -40,9 +40,9 @@ int Fail(const char* message) {
 int Statement(int argc, char** argv) {
     std::map<std::string, std::string> opt;
     bool cc = false, xml = false;
-    static const char* const valued[] = {"--bank-id", "--account", "--type", "--from",  "--to",     "--user",
-                                         "--password", "--org",    "--fid",  "--app-id", "--app-ver", "--trnuid",
-                                         "-o"};
+    static const char* const valued[] = {"--bank-id", "--account",  "--type", "--from", "--to",
+                                         "--user",    "--password", "--org",  "--fid",  "--app-id",
+                                         "--app-ver", "--trnuid",   "-o"};
     for (int i = 0; i < argc; ++i) {
         std::string a = argv[i];
         if (a == "--cc") {
@@ -66,7 +66,8 @@ int Statement(int argc, char** argv) {
         std::fputs(kUsage, stderr);
         return 2;
     }
-    if (!opt.count("--password") && std::getenv("OESDK_PASSWORD")) opt["--password"] = std::getenv("OESDK_PASSWORD");
+    if (!opt.count("--password") && std::getenv("OESDK_PASSWORD"))
+        opt["--password"] = std::getenv("OESDK_PASSWORD");
 
     OEDataObjFactory* f = OEDataObj::GetFactory();
     if (!f) return Fail("out of memory");
@@ -108,8 +109,10 @@ int Statement(int argc, char** argv) {
     set->AppendTrans(wrapper);
     std::string trnuid = opt.count("--trnuid") ? opt["--trnuid"] : "OESDK-" + UtcNow();
     wrapper->SetTransUserID(OEString(trnuid.c_str()));
-    if (opt.count("--from") && !inc->SetDateStart(OEString(opt["--from"].c_str()))) return Fail("--from is not a date");
-    if (opt.count("--to") && !inc->SetDateEnd(OEString(opt["--to"].c_str()))) return Fail("--to is not a date");
+    if (opt.count("--from") && !inc->SetDateStart(OEString(opt["--from"].c_str())))
+        return Fail("--from is not a date");
+    if (opt.count("--to") && !inc->SetDateEnd(OEString(opt["--to"].c_str())))
+        return Fail("--to is not a date");
     inc->SetInclude(static_cast<unsigned short>(1));
     if (cc) {
         OECCStatementRq* stmt = f->NewCCStatementRq(1);
@@ -146,7 +149,8 @@ int Statement(int argc, char** argv) {
     OETagID missingTag = OETAG_NONE;
     if (!OEUtility::AllRequiredPresent(doc.file.get(), &missingIn, &missingTag)) {
         std::fprintf(stderr, "oesdk request statement: %s lacks %s (give --user with --password)\n",
-                     missingIn ? TagName(missingIn->GetType()).c_str() : "the request", TagName(missingTag).c_str());
+                     missingIn ? TagName(missingIn->GetType()).c_str() : "the request",
+                     TagName(missingTag).c_str());
         return 1;
     }
     FILE* out = opt.count("-o") ? std::fopen(opt["-o"].c_str(), "wb") : stdout;

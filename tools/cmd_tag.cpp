@@ -44,7 +44,8 @@ int Run(int argc, char** argv) {
     OETagID found = OETAG_NONE;
     if (length > 0 && length < 256) {
         unsigned short n = static_cast<unsigned short>(length);
-        if (!dictionary->GetTagID(arg, n, &found, OECaseSensitive)) dictionary->GetTagID(arg, n, &found, OECaseInsensitive);
+        if (!dictionary->GetTagID(arg, n, &found, OECaseSensitive))
+            dictionary->GetTagID(arg, n, &found, OECaseInsensitive);
     }
     if (found == OETAG_NONE) {
         std::fprintf(stderr, "oesdk tag: unknown tag name '%s'\n", arg);
@@ -56,4 +57,5 @@ int Run(int argc, char** argv) {
 
 } // namespace
 
-OE_TOOL_COMMAND(tag, "tag", "NAME|ID", "look a tag up in the dictionary: a name prints its id, an id its name", Run);
+OE_TOOL_COMMAND(tag, "tag", "NAME|ID",
+                "look a tag up in the dictionary: a name prints its id, an id its name", Run);

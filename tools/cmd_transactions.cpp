@@ -12,7 +12,9 @@ struct Row {
     std::string account, kind, posted, type, amount, fitid, name, memo, checknum;
 };
 
-std::string Text(const OEString* s) { return s ? s->c_str() : ""; }
+std::string Text(const OEString* s) {
+    return s ? s->c_str() : "";
+}
 
 void CollectStatement(OEDataObj* object, std::vector<Row>& rows) {
     OEBankTransactionList* list = nullptr;
@@ -124,18 +126,19 @@ int Run(int argc, char** argv) {
     if (format == "csv") {
         std::printf("account,statement,date_posted,type,amount,fitid,name,memo,checknum\n");
         for (const Row& r : rows)
-            std::printf("%s,%s,%s,%s,%s,%s,%s,%s,%s\n", Csv(r.account).c_str(), r.kind.c_str(), r.posted.c_str(),
-                        r.type.c_str(), r.amount.c_str(), Csv(r.fitid).c_str(), Csv(r.name).c_str(),
-                        Csv(r.memo).c_str(), Csv(r.checknum).c_str());
+            std::printf("%s,%s,%s,%s,%s,%s,%s,%s,%s\n", Csv(r.account).c_str(), r.kind.c_str(),
+                        r.posted.c_str(), r.type.c_str(), r.amount.c_str(), Csv(r.fitid).c_str(),
+                        Csv(r.name).c_str(), Csv(r.memo).c_str(), Csv(r.checknum).c_str());
     } else {
         std::printf("[");
         for (size_t i = 0; i < rows.size(); ++i) {
             const Row& r = rows[i];
-            std::printf("%s\n  {\"account\": %s, \"statement\": %s, \"date_posted\": %s, \"type\": %s, \"amount\": %s, "
+            std::printf("%s\n  {\"account\": %s, \"statement\": %s, \"date_posted\": %s, \"type\": %s, "
+                        "\"amount\": %s, "
                         "\"fitid\": %s, \"name\": %s, \"memo\": %s, \"checknum\": %s}",
                         i ? "," : "", Json(r.account).c_str(), Json(r.kind).c_str(), Json(r.posted).c_str(),
-                        Json(r.type).c_str(), Json(r.amount).c_str(), Json(r.fitid).c_str(), Json(r.name).c_str(),
-                        Json(r.memo).c_str(), Json(r.checknum).c_str());
+                        Json(r.type).c_str(), Json(r.amount).c_str(), Json(r.fitid).c_str(),
+                        Json(r.name).c_str(), Json(r.memo).c_str(), Json(r.checknum).c_str());
         }
         std::printf("%s]\n", rows.empty() ? "" : "\n");
     }

@@ -6,10 +6,10 @@
 #include <vector>
 
 struct ToolCommand {
-    const char* name;      // first word on the command line
-    const char* synopsis;  // arguments, for the usage text
-    const char* summary;   // one line
-    int (*run)(int argc, char** argv);  // arguments after the command name; returns the exit code
+    const char* name;                  // first word on the command line
+    const char* synopsis;              // arguments, for the usage text
+    const char* summary;               // one line
+    int (*run)(int argc, char** argv); // arguments after the command name; returns the exit code
 };
 
 // Every registered command, in registration order.
@@ -19,6 +19,7 @@ struct ToolCommandRegistration {
     explicit ToolCommandRegistration(const ToolCommand& command) { ToolCommands().push_back(command); }
 };
 
-#define OE_TOOL_COMMAND(id, ...) static const ToolCommandRegistration id##_registration(ToolCommand{__VA_ARGS__})
+#define OE_TOOL_COMMAND(id, ...)                                                                             \
+    static const ToolCommandRegistration id##_registration(ToolCommand{__VA_ARGS__})
 
 #endif

@@ -27,7 +27,8 @@ void Usage(FILE* out) {
         std::string head = std::string(c.name) + " " + c.synopsis;
         std::fprintf(out, "  %s\n      %s\n", head.c_str(), c.summary);
     }
-    std::fputs("\noptions:\n  -h, --help       show this help\n  --version        show the library version\n", out);
+    std::fputs("\noptions:\n  -h, --help       show this help\n  --version        show the library version\n",
+               out);
 }
 
 } // namespace

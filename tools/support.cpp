@@ -25,7 +25,8 @@ bool LooksLikeRequest(const std::string& text) {
 class PreservingBuilder : public OEBuilder {
 public:
     PreservingBuilder(OEBuildStringCrLfOpt crlf, unsigned short endTags) : OEBuilder(crlf, endTags) {}
-    OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf) override {
+    OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros,
+                            OEBuildStringCrLfOpt crlf) override {
         if (!value.ExceedsSpecLength() && value.GetEncoding() != OESE_CDATA)
             return OEBuilder::AddString(value, macros, crlf);
         // Over-long text is kept whole, and a value read from a CDATA section is written back as
@@ -119,8 +120,9 @@ int WriteDocument(Document& doc, bool xml, std::string& out) {
         std::string version = HeaderOr(file, OEHT_VERSION, "211");
         if (version.empty() || version[0] != '2') version = "211";
         head += "<?OFX OFXHEADER=\"200\" VERSION=\"" + version + "\" SECURITY=\"" +
-                HeaderOr(file, OEHT_SECURITY, "NONE") + "\" OLDFILEUID=\"" + HeaderOr(file, OEHT_OLDFILEUID, "NONE") +
-                "\" NEWFILEUID=\"" + HeaderOr(file, OEHT_NEWFILEUID, "NONE") + "\"?>\r\n";
+                HeaderOr(file, OEHT_SECURITY, "NONE") + "\" OLDFILEUID=\"" +
+                HeaderOr(file, OEHT_OLDFILEUID, "NONE") + "\" NEWFILEUID=\"" +
+                HeaderOr(file, OEHT_NEWFILEUID, "NONE") + "\"?>\r\n";
         buffer.WriteLarge(head.data(), static_cast<unsigned long>(head.size()));
         file.SetOmitHeaders(1);
     } else {

@@ -12,8 +12,8 @@
 // One logged irregularity, copied out of the thread's parse log.
 struct LoggedProblem {
     OEParseWarning code;
-    std::string warning;  // "OEPW_..."
-    std::string tag;      // tag name, or empty
+    std::string warning; // "OEPW_..."
+    std::string tag;     // tag name, or empty
     std::string text;
     std::string aux;
     unsigned long offset;
@@ -22,7 +22,7 @@ struct LoggedProblem {
 struct Document {
     std::string path;
     std::string text;
-    std::unique_ptr<OEFileOFX> file;  // an OEFileRq or an OEFileRs
+    std::unique_ptr<OEFileOFX> file; // an OEFileRq or an OEFileRs
     bool request = false;
     OEParseStatus status = OEPS_OK;
     unsigned short headersAcceptable = 1;
@@ -39,7 +39,8 @@ std::string TagName(OETagID tag);
 template <class F> void WalkTree(OEDataObj* object, int depth, F&& visit) {
     if (!object) return;
     visit(object, depth);
-    for (unsigned short i = 0; i < object->GetNumberOfChildren(); ++i) WalkTree(object->GetChild(i), depth + 1, visit);
+    for (unsigned short i = 0; i < object->GetNumberOfChildren(); ++i)
+        WalkTree(object->GetChild(i), depth + 1, visit);
 }
 
 // Writes the document: SGML-like form with the plain header block, or XML-like form (element end

@@ -53,7 +53,9 @@ void OEBuilder::Put(const char* text, unsigned long length) {
         m_buffer->WriteLarge(text, length);
 }
 
-void OEBuilder::Put(const char* text) { Put(text, std::strlen(text)); }
+void OEBuilder::Put(const char* text) {
+    Put(text, std::strlen(text));
+}
 
 const char* OEBuilder::TagText(OETagID tag) const {
     // Every tag of the dictionary by id, looked up once for the process.
@@ -132,7 +134,9 @@ OEBuildStatus OEBuilder::AddTagElement(OETagID tag) {
     return name ? AddTag(OETT_ELEMENT, name) : OEBS_BADARGUMENT;
 }
 
-OEBuildStatus OEBuilder::AddTagElementEnd(OETagID tag) { return AddTagEnd(tag); }
+OEBuildStatus OEBuilder::AddTagElementEnd(OETagID tag) {
+    return AddTagEnd(tag);
+}
 
 OEBuildStatus OEBuilder::AddBlankLine() {
     if (!m_buffer) return OEBS_BADARGUMENT;
@@ -153,7 +157,9 @@ OEBuildStatus OEBuilder::AddHeader(OEHeaderTag tag, const OEString& value) {
     return AddBlankLine();
 }
 
-OEBuildStatus OEBuilder::AddOESShort(short value) { return AddOESLong(value); }
+OEBuildStatus OEBuilder::AddOESShort(short value) {
+    return AddOESLong(value);
+}
 
 OEBuildStatus OEBuilder::AddOEUShort(unsigned short value, char pad, unsigned short width) {
     if (!m_buffer) return OEBS_BADARGUMENT;
@@ -168,7 +174,9 @@ OEBuildStatus OEBuilder::AddOEUShort(unsigned short value, char pad, unsigned sh
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddOEUShort(unsigned short value) { return AddOEULong(value); }
+OEBuildStatus OEBuilder::AddOEUShort(unsigned short value) {
+    return AddOEULong(value);
+}
 
 OEBuildStatus OEBuilder::AddOESLong(long value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
@@ -199,19 +207,21 @@ OEBuildStatus OEBuilder::AddOEBoolean(unsigned short value) {
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddString(const OEString* value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf) {
+OEBuildStatus OEBuilder::AddString(const OEString* value, OEBuildStringMacroOpt macros,
+                                   OEBuildStringCrLfOpt crlf) {
     if (!value) return OEBS_BLANKVALUE;
     return AddString(*value, macros, crlf);
 }
 
-OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf) {
+OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt macros,
+                                   OEBuildStringCrLfOpt crlf) {
     if (!m_buffer) return OEBS_BADARGUMENT;
     const char* text = value.c_str();
     unsigned long length = value.GetStrLength();
     bool valid = value.IsValid() != 0;
     bool tooLong = length > value.SpecLength();
     if (!valid && m_stringOpt == OEBSO_STRICT) return tooLong ? OEBS_STRINGTOOLONG : OEBS_INVALIDSTRING;
-    bool truncate = !valid && tooLong;  // lenient: cut the working copy to the spec length
+    bool truncate = !valid && tooLong; // lenient: cut the working copy to the spec length
 
     if (value.GetEncoding() == OESE_CDATA) {
         // The text itself, then a CDATA section holding the same text: kept as the builder's form.
@@ -256,10 +266,18 @@ OEBuildStatus OEBuilder::AddPrecisionInteger(const OEPrecisionInteger& value) {
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddAmount(const OEPrecisionInteger& value) { return AddPrecisionInteger(value); }
-OEBuildStatus OEBuilder::AddQuantity(const OEPrecisionInteger& value) { return AddPrecisionInteger(value); }
-OEBuildStatus OEBuilder::AddUnitPrice(const OEPrecisionInteger& value) { return AddPrecisionInteger(value); }
-OEBuildStatus OEBuilder::AddRate(const OEPrecisionInteger& value) { return AddPrecisionInteger(value); }
+OEBuildStatus OEBuilder::AddAmount(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddQuantity(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddUnitPrice(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddRate(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
 
 OEBuildStatus OEBuilder::AddDateTime(const OEDateTime& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
@@ -311,8 +329,12 @@ OEBuildStatus OEBuilder::AddSyncMode(OESyncMode value) {
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddServerID(const OEString36& value) { return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE); }
-OEBuildStatus OEBuilder::AddPayeeID(const OEString12& value) { return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE); }
+OEBuildStatus OEBuilder::AddServerID(const OEString36& value) {
+    return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
+}
+OEBuildStatus OEBuilder::AddPayeeID(const OEString12& value) {
+    return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
+}
 
 OEBuildStatus OEBuilder::AddLanguage(const OELanguage& value) {
     OEString text;

@@ -70,8 +70,10 @@ public:
     virtual OEBuildStatus AddOEULong(unsigned long value);
     virtual OEBuildStatus AddOEChar(char value);
     virtual OEBuildStatus AddOEBoolean(unsigned short value);
-    virtual OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf);
-    virtual OEBuildStatus AddString(const OEString* value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf);
+    virtual OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros,
+                                    OEBuildStringCrLfOpt crlf);
+    virtual OEBuildStatus AddString(const OEString* value, OEBuildStringMacroOpt macros,
+                                    OEBuildStringCrLfOpt crlf);
     virtual OEBuildStatus AddAmount(const OEPrecisionInteger& value);
     virtual OEBuildStatus AddDateTime(const OEDateTime& value);
     virtual OEBuildStatus AddTime(const OETime& value);

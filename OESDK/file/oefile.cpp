@@ -15,7 +15,9 @@ const char OEMIME_OFXTYPE[] = "application/x-ofx";
 
 namespace {
 
-inline bool IsOFXHeader(int tag) { return tag >= OEHT_OFXHEADER && tag <= OEHT_NEWFILEUID; }
+inline bool IsOFXHeader(int tag) {
+    return tag >= OEHT_OFXHEADER && tag <= OEHT_NEWFILEUID;
+}
 
 const char* HeaderName(OEHeaderTag tag) {
     static const char* const names[] = {"CONTENT-TYPE", "CONTENT-LENGTH", "OFXHEADER", "DATA",
@@ -38,7 +40,7 @@ OEFile::~OEFile() {}
 unsigned short OEFile::SetHeader(OEHeaderTag tag, const OEString* value) {
     if (!IsOFXHeader(tag) || !value || value->IsWhiteSpace()) return 0;
     m_headers[tag] = *value;
-    if (m_headers[tag].IsNull()) return 0;  // no memory for the copy
+    if (m_headers[tag].IsNull()) return 0; // no memory for the copy
     m_headerSet[tag] = true;
     return 1;
 }
@@ -83,7 +85,9 @@ OEMIMEHeader* OEFile::GetMIMEHeader(const OEString* name) const {
     return nullptr;
 }
 
-unsigned short OEFile::AppendSubfile(const OEFile* subfile) { return SetSubfile(m_subfiles.Entries(), subfile); }
+unsigned short OEFile::AppendSubfile(const OEFile* subfile) {
+    return SetSubfile(m_subfiles.Entries(), subfile);
+}
 
 unsigned short OEFile::SetSubfile(unsigned short index, const OEFile* subfile) {
     if (!subfile || index > m_subfiles.Entries()) return 0;
@@ -109,8 +113,12 @@ unsigned short OEFile::SetSubfile(unsigned short index, const OEFile* subfile) {
     return 1;
 }
 
-OEDataObj* OEFile::GetChild(unsigned short index) const { return m_subfiles.Get(index); }
-unsigned short OEFile::GetNumberOfChildren() const { return m_subfiles.Entries(); }
+OEDataObj* OEFile::GetChild(unsigned short index) const {
+    return m_subfiles.Get(index);
+}
+unsigned short OEFile::GetNumberOfChildren() const {
+    return m_subfiles.Entries();
+}
 
 int OEFile::BuildHeaders(OEBuilder* builder) {
     for (unsigned short i = 0; i < m_mime.Entries(); ++i) {
@@ -149,7 +157,8 @@ int OEFile::Build(OEBuilder* builder) {
         char size[32];
         std::snprintf(size, sizeof(size), "%ld", static_cast<long>(text.GetBufferSize()));
         OEString lengthName(OEMIME_CONTENTLENGTH), lengthValue(size);
-        if (sub->HandleHeader(static_cast<OEHeaderTag>(-1), lengthValue, &lengthName) != OEPS_OK) return OEBS_OUTOFMEMORY;
+        if (sub->HandleHeader(static_cast<OEHeaderTag>(-1), lengthValue, &lengthName) != OEPS_OK)
+            return OEBS_OUTOFMEMORY;
         if (sub->GetType() == OETAG_OFXFILERQ || sub->GetType() == OETAG_OFXFILERS) {
             OEString typeName(OEMIME_CONTENTTYPE), typeValue(OEMIME_OFXTYPE);
             if (sub->HandleHeader(static_cast<OEHeaderTag>(-1), typeValue, &typeName) != OEPS_OK)
@@ -303,24 +312,30 @@ namespace {
 
 // An element directly under the file is an error: logged as OEPW_INVALIDELEM, status 4.
 OEParseStatus ElementUnderFile(OEDataObj* file, const OETagDictionaryEntry* entry, const OEString& value) {
-    OELogParseWarning(OEPW_INVALIDELEM, entry ? entry->m_name : "", value.c_str(), entry ? entry->m_id : OETAG_NONE,
-                      file);
+    OELogParseWarning(OEPW_INVALIDELEM, entry ? entry->m_name : "", value.c_str(),
+                      entry ? entry->m_id : OETAG_NONE, file);
     return OEPS_INVALID;
 }
 
 } // namespace
 
-OEFileRq::OEFileRq(unsigned short version) : OEFileOFX(version), m_requests(1, 1) { SetType(OETAG_OFXFILERQ); }
+OEFileRq::OEFileRq(unsigned short version) : OEFileOFX(version), m_requests(1, 1) {
+    SetType(OETAG_OFXFILERQ);
+}
 OEFileRq::~OEFileRq() {}
 
-unsigned short OEFileRq::AppendRequest(OERequest* request) { return SetRequest(m_requests.Entries(), request); }
+unsigned short OEFileRq::AppendRequest(OERequest* request) {
+    return SetRequest(m_requests.Entries(), request);
+}
 
 unsigned short OEFileRq::SetRequest(unsigned short index, OERequest* request) {
     if (!request || index > m_requests.Entries()) return 0;
     return m_requests.Set(index, request);
 }
 
-OERequest* OEFileRq::GetRequest(unsigned short index) const { return static_cast<OERequest*>(m_requests.Get(index)); }
+OERequest* OEFileRq::GetRequest(unsigned short index) const {
+    return static_cast<OERequest*>(m_requests.Get(index));
+}
 
 OEParseStatus OEFileRq::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry || entry->m_id != OETAG_OFX) return OEDataObj::HandleTagStart(entry);
@@ -384,10 +399,14 @@ unsigned short OEFileRq::DeepCopyFrom(const OEFile* other) {
     return 1;
 }
 
-OEFileRs::OEFileRs(unsigned short version) : OEFileOFX(version), m_responses(1, 1) { SetType(OETAG_OFXFILERS); }
+OEFileRs::OEFileRs(unsigned short version) : OEFileOFX(version), m_responses(1, 1) {
+    SetType(OETAG_OFXFILERS);
+}
 OEFileRs::~OEFileRs() {}
 
-unsigned short OEFileRs::AppendResponse(OEResponse* response) { return SetResponse(m_responses.Entries(), response); }
+unsigned short OEFileRs::AppendResponse(OEResponse* response) {
+    return SetResponse(m_responses.Entries(), response);
+}
 
 unsigned short OEFileRs::SetResponse(unsigned short index, OEResponse* response) {
     if (!response || index > m_responses.Entries()) return 0;

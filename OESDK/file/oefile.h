@@ -17,9 +17,9 @@ class OERequest;
 class OEResponse;
 
 // The MIME names and content type the file layer writes.
-extern OE_API const char OEMIME_CONTENTLENGTH[];  // "content-length"
-extern OE_API const char OEMIME_CONTENTTYPE[];    // "content-type"
-extern OE_API const char OEMIME_OFXTYPE[];        // "application/x-ofx"
+extern OE_API const char OEMIME_CONTENTLENGTH[]; // "content-length"
+extern OE_API const char OEMIME_CONTENTTYPE[];   // "content-type"
+extern OE_API const char OEMIME_OFXTYPE[];       // "application/x-ofx"
 
 class OE_API OEFile : public OEDataObj {
 public:
@@ -71,7 +71,7 @@ protected:
     OEString m_boundary;
     OEString m_mimeBody;
     OEPtrArray<OEFile> m_subfiles;
-    OEString m_headers[11];  // indexed by OEHeaderTag; empty until set
+    OEString m_headers[11]; // indexed by OEHeaderTag; empty until set
     bool m_headerSet[11];
 };
 

@@ -9,8 +9,8 @@ const char* const kAcctType2[] = {"CHECKING", "SAVINGS", "MONEYMRKT", "CREDITLIN
 const char* const kBalType[] = {"DOLLAR", "PERCENT", "NUMBER"};
 
 // ---- BANKACCTFROM / BANKACCTTO ----
-const OETagRow kBankAcctValid[] = {{OETAG_BANKID, OEVM_ALL, 0},  {OETAG_BRANCHID, OEVM_ALL, 0},
-                                   {OETAG_ACCTID, OEVM_ALL, 0},  {OETAG_ACCTTYPE, OEVM_V1, 0},
+const OETagRow kBankAcctValid[] = {{OETAG_BANKID, OEVM_ALL, 0},      {OETAG_BRANCHID, OEVM_ALL, 0},
+                                   {OETAG_ACCTID, OEVM_ALL, 0},      {OETAG_ACCTTYPE, OEVM_V1, 0},
                                    {OETAG_ACCTTYPE2, OEVM_NOTV1, 0}, {OETAG_ACCTKEY, OEVM_ALL, 0}};
 // Each version requires exactly its own account-type element.
 const OETagRow kBankAcctRequired[] = {{OETAG_BANKID, OEVM_ALL, 0},
@@ -42,11 +42,10 @@ const OEFieldRow kBankBalFields[] = {
 };
 
 // ---- BAL ----
-const OETagRow kBalValid[] = {{OETAG_VALUE, OEVM_ALL, 0},    {OETAG_NAME, OEVM_ALL, 0},
-                              {OETAG_DTASOF, OEVM_ALL, 0},   {OETAG_BALTYPE, OEVM_ALL, 0},
-                              {OETAG_DESC, OEVM_ALL, 0},     {OETAG_LEDGERBAL, OEVM_ALL, 0},
-                              {OETAG_AVAILBAL, OEVM_ALL, 0}, {OETAG_BAL, OEVM_ALL, 0},
-                              {OETAG_CURRENCY, OEVM_ALL, 0}};
+const OETagRow kBalValid[] = {
+    {OETAG_VALUE, OEVM_ALL, 0},    {OETAG_NAME, OEVM_ALL, 0}, {OETAG_DTASOF, OEVM_ALL, 0},
+    {OETAG_BALTYPE, OEVM_ALL, 0},  {OETAG_DESC, OEVM_ALL, 0}, {OETAG_LEDGERBAL, OEVM_ALL, 0},
+    {OETAG_AVAILBAL, OEVM_ALL, 0}, {OETAG_BAL, OEVM_ALL, 0},  {OETAG_CURRENCY, OEVM_ALL, 0}};
 const OETagRow kBalRequired[] = {{OETAG_VALUE, OEVM_ALL, 0},
                                  {OETAG_NAME, OEVM_ALL, 0},
                                  {OETAG_BALTYPE, OEVM_ALL, 0},
@@ -61,13 +60,12 @@ const OEFieldRow kBalFields[] = {
 };
 
 // ---- PAYEE / PAYEE2 ----
-const OETagRow kPayeeValid[] = {{OETAG_NAME, OEVM_ALL, 0},  {OETAG_ADDR1, OEVM_ALL, 0},
-                                {OETAG_ADDR2, OEVM_ALL, 0}, {OETAG_ADDR3, OEVM_ALL, 0},
-                                {OETAG_CITY, OEVM_ALL, 0},  {OETAG_STATE, OEVM_ALL, 0},
-                                {OETAG_POSTALCODE, OEVM_ALL, 0}, {OETAG_COUNTRY, OEVM_ALL, 0},
-                                {OETAG_PHONE, OEVM_ALL, 0}};
-const OETagRow kPayeeRequired[] = {{OETAG_NAME, OEVM_ALL, 0}, {OETAG_ADDR1, OEVM_ALL, 0},
-                                   {OETAG_CITY, OEVM_ALL, 0}, {OETAG_STATE, OEVM_ALL, 0},
+const OETagRow kPayeeValid[] = {
+    {OETAG_NAME, OEVM_ALL, 0},       {OETAG_ADDR1, OEVM_ALL, 0},   {OETAG_ADDR2, OEVM_ALL, 0},
+    {OETAG_ADDR3, OEVM_ALL, 0},      {OETAG_CITY, OEVM_ALL, 0},    {OETAG_STATE, OEVM_ALL, 0},
+    {OETAG_POSTALCODE, OEVM_ALL, 0}, {OETAG_COUNTRY, OEVM_ALL, 0}, {OETAG_PHONE, OEVM_ALL, 0}};
+const OETagRow kPayeeRequired[] = {{OETAG_NAME, OEVM_ALL, 0},       {OETAG_ADDR1, OEVM_ALL, 0},
+                                   {OETAG_CITY, OEVM_ALL, 0},       {OETAG_STATE, OEVM_ALL, 0},
                                    {OETAG_POSTALCODE, OEVM_ALL, 0}, {OETAG_PHONE, OEVM_ALL, 0}};
 const OETagRow kPayee2Required[] = {{OETAG_NAME, OEVM_ALL, 0}};
 const OEFieldRow kPayeeFields[] = {
@@ -82,7 +80,8 @@ const OEFieldRow kPayeeFields[] = {
     {OETAG_PHONE, OEFK_TEXT, OE_MEMBER(OEPayee, m_phone), nullptr, nullptr},
 };
 
-const OEAggregateDesc kBankAcctDesc = OE_DESC(OETAG_BANKACCTFROM, kBankAcctValid, kBankAcctRequired, kBankAcctFields);
+const OEAggregateDesc kBankAcctDesc =
+    OE_DESC(OETAG_BANKACCTFROM, kBankAcctValid, kBankAcctRequired, kBankAcctFields);
 const OEAggregateDesc kCCAcctDesc = OE_DESC(OETAG_CCACCTFROM, kCCAcctValid, kCCAcctRequired, kCCAcctFields);
 const OEAggregateDesc kBankBalDesc = OE_DESC(OETAG_LEDGERBAL, kBankBalValid, kBankBalValid, kBankBalFields);
 const OEAggregateDesc kBalDesc = OE_DESC(OETAG_BAL, kBalValid, kBalRequired, kBalFields);
@@ -95,8 +94,12 @@ const OEKeywordTable OEKW_BANKACCOUNTTYPE = {kAcctType, 6};
 const OEKeywordTable OEKW_BANKACCOUNTTYPE2 = {kAcctType2, 5};
 const OEKeywordTable OEKW_BALTYPE = {kBalType, 3};
 
-OEBankAccount::OEBankAccount(unsigned short version) : OEBankOrCCAccount(version) { SetType(OETAG_BANKACCTFROM); }
-const OEAggregateDesc& OEBankAccount::Describe() const { return kBankAcctDesc; }
+OEBankAccount::OEBankAccount(unsigned short version) : OEBankOrCCAccount(version) {
+    SetType(OETAG_BANKACCTFROM);
+}
+const OEAggregateDesc& OEBankAccount::Describe() const {
+    return kBankAcctDesc;
+}
 
 const char* OEBankAccount::GetAcctTypeText() const {
     if (ValidateTag(OETAG_ACCTTYPE) && m_acctType < OEKW_BANKACCOUNTTYPE.m_count)
@@ -106,16 +109,34 @@ const char* OEBankAccount::GetAcctTypeText() const {
     return nullptr;
 }
 
-OECCAccount::OECCAccount(unsigned short version) : OEBankOrCCAccount(version) { SetType(OETAG_CCACCTFROM); }
-const OEAggregateDesc& OECCAccount::Describe() const { return kCCAcctDesc; }
+OECCAccount::OECCAccount(unsigned short version) : OEBankOrCCAccount(version) {
+    SetType(OETAG_CCACCTFROM);
+}
+const OEAggregateDesc& OECCAccount::Describe() const {
+    return kCCAcctDesc;
+}
 
-const OEAggregateDesc& OEBankBalance::Describe() const { return kBankBalDesc; }
+const OEAggregateDesc& OEBankBalance::Describe() const {
+    return kBankBalDesc;
+}
 
-OEBalance::OEBalance(unsigned short version) : OEAggregate(version) { SetType(OETAG_BAL); }
-const OEAggregateDesc& OEBalance::Describe() const { return kBalDesc; }
+OEBalance::OEBalance(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_BAL);
+}
+const OEAggregateDesc& OEBalance::Describe() const {
+    return kBalDesc;
+}
 
-OEPayee::OEPayee(unsigned short version) : OEAggregate(version) { SetType(OETAG_PAYEE); }
-const OEAggregateDesc& OEPayee::Describe() const { return kPayeeDesc; }
+OEPayee::OEPayee(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_PAYEE);
+}
+const OEAggregateDesc& OEPayee::Describe() const {
+    return kPayeeDesc;
+}
 
-OEPayee2::OEPayee2(unsigned short version) : OEPayee(version) { SetType(OETAG_PAYEE2); }
-const OEAggregateDesc& OEPayee2::Describe() const { return kPayee2Desc; }
+OEPayee2::OEPayee2(unsigned short version) : OEPayee(version) {
+    SetType(OETAG_PAYEE2);
+}
+const OEAggregateDesc& OEPayee2::Describe() const {
+    return kPayee2Desc;
+}

@@ -4,9 +4,9 @@
 #include "messages/oeaggregate.h"
 
 // Keyword tables of the enumerations these aggregates hold (value i = keyword i).
-extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE;   // ACCTTYPE: "UNKNOWN", "CHECKING", ...
-extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE2;  // ACCTTYPE2: "CHECKING", "SAVINGS", ...
-extern OE_API const OEKeywordTable OEKW_BALTYPE;           // "DOLLAR", "PERCENT", "NUMBER"
+extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE;  // ACCTTYPE: "UNKNOWN", "CHECKING", ...
+extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE2; // ACCTTYPE2: "CHECKING", "SAVINGS", ...
+extern OE_API const OEKeywordTable OEKW_BALTYPE;          // "DOLLAR", "PERCENT", "NUMBER"
 
 // The common base of every account aggregate. The same class serves the FROM and the TO form; the
 // tag is chosen when the object is made.
@@ -84,12 +84,16 @@ public:
 
 class OE_API OELedgerBalance : public OEBankBalance {
 public:
-    explicit OELedgerBalance(unsigned short version = 0) : OEBankBalance(version) { SetType(OETAG_LEDGERBAL); }
+    explicit OELedgerBalance(unsigned short version = 0) : OEBankBalance(version) {
+        SetType(OETAG_LEDGERBAL);
+    }
 };
 
 class OE_API OEAvailableBalance : public OEBankBalance {
 public:
-    explicit OEAvailableBalance(unsigned short version = 0) : OEBankBalance(version) { SetType(OETAG_AVAILBAL); }
+    explicit OEAvailableBalance(unsigned short version = 0) : OEBankBalance(version) {
+        SetType(OETAG_AVAILBAL);
+    }
 };
 
 // BAL: one named balance of a balance list.

@@ -67,7 +67,7 @@ const unsigned char* OEAggregateDesc::Bits() const {
     }
     const unsigned char* expected = nullptr;
     if (!m_bits.compare_exchange_strong(expected, fresh, std::memory_order_acq_rel)) {
-        delete[] fresh;  // another thread won; the tables live as long as the process
+        delete[] fresh; // another thread won; the tables live as long as the process
         return expected;
     }
     return fresh;
@@ -87,7 +87,9 @@ unsigned short OEAggregate::RowPresent(unsigned short index) const {
 // Members own their children (OEOwnedChild, OEDataObjList), so they go with the members.
 OEAggregate::~OEAggregate() {}
 
-OEOwnedChild::~OEOwnedChild() { delete m_obj; }
+OEOwnedChild::~OEOwnedChild() {
+    delete m_obj;
+}
 
 void OEAggregate::DeleteChildren() {
     const OEAggregateDesc& d = Describe();
@@ -179,7 +181,7 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
         unsigned short spec = str->SpecLength();
         *str = text;
         str->SetSpecLength(spec);
-        if (text.GetStrLength() && str->IsNull()) return 3;  // no memory for the value
+        if (text.GetStrLength() && str->IsNull()) return 3; // no memory for the value
         if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
         SetTag(tag);
         return 1;
@@ -210,6 +212,8 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
         SetTag(tag);
         return 1;
     }
+    case OEFK_TEXTLIST:
+        return AppendText(tag, text);
     case OEFK_ENUM: {
         int index = MatchKeyword(row->m_keywords, s);
         if (index < 0) break;
@@ -468,6 +472,12 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
     case OEFK_SLONG:
         status = builder->AddTagOESLong(tag, *static_cast<const long*>(slot));
         break;
+    case OEFK_TEXTLIST: {
+        const OEDynamicArrayString* list = static_cast<const OEDynamicArrayString*>(slot);
+        for (unsigned short i = 0; i < list->Entries() && status == OEBS_OK; ++i)
+            status = builder->AddTagOEString(tag, list->GetString(i));
+        break;
+    }
     default:
         break;
     }
@@ -551,6 +561,12 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
         case OEFK_SLONG:
             *static_cast<long*>(to) = *static_cast<const long*>(from);
             break;
+        case OEFK_TEXTLIST:
+            static_cast<OEDynamicArrayString*>(to)->DeleteAll();
+            if (!static_cast<OEDynamicArrayString*>(to)->DeepCopyFrom(
+                    *static_cast<const OEDynamicArrayString*>(from)))
+                return 0;
+            break;
         case OEFK_CHILD: {
             OEDataObj* src = *static_cast<OEDataObj* const*>(from);
             if (!src || src->GetType() != row->m_tag) break;
@@ -578,13 +594,32 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
         }
         }
     }
-    return CopyBaseMembersFrom(const_cast<OEAggregate*>(other));
+    if (!CopyExtraFrom(other)) return 0;
+    return CopyBaseMembersFrom(other);
+}
+
+unsigned short OEAggregate::CopyExtraFrom(const OEAggregate*) {
+    return 1;
+}
+
+OEDynamicArrayString* OEAggregate::GetTextList(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_TEXTLIST) return nullptr;
+    return static_cast<OEDynamicArrayString*>(Slot(row));
+}
+
+unsigned short OEAggregate::AppendText(OETagID tag, const OEString& value) {
+    OEDynamicArrayString* list = GetTextList(tag);
+    if (!list || !IsValidTag(tag)) return 0;
+    if (!list->AddString(value)) return 3;
+    if (value.ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, value.c_str(), "", tag, this);
+    return SetTag(tag);
 }
 
 void OEAggregate::AmountText(const OEPrecisionInteger& value, OEString& out) {
     OEPrecisionInteger copy(value);
     unsigned short scale = copy.Decimal();
-    const char* plain = static_cast<char*>(copy);  // trailing zeros dropped
+    const char* plain = static_cast<char*>(copy); // trailing zeros dropped
     std::string text = plain ? plain : "0";
     bool negative = !text.empty() && text[0] == '-';
     std::string digits = negative ? text.substr(1) : text;
@@ -623,8 +658,17 @@ unsigned short OEAggregate::GetFieldText(const OEFieldRow* row, OEString& out) c
     case OEFK_BOOL:
         out = *static_cast<const unsigned short*>(slot) ? "Y" : "N";
         return 1;
+    case OEFK_TEXTLIST: {
+        const OEDynamicArrayString* list = static_cast<const OEDynamicArrayString*>(slot);
+        std::string joined;
+        for (unsigned short i = 0; i < list->Entries(); ++i)
+            joined += (i ? ", " : "") + std::string(list->GetString(i)->c_str());
+        out = joined.c_str();
+        return 1;
+    }
     case OEFK_USHORT:
-        std::snprintf(number, sizeof(number), "%u", static_cast<unsigned>(*static_cast<const unsigned short*>(slot)));
+        std::snprintf(number, sizeof(number), "%u",
+                      static_cast<unsigned>(*static_cast<const unsigned short*>(slot)));
         break;
     case OEFK_ULONG:
         std::snprintf(number, sizeof(number), "%lu", *static_cast<const unsigned long*>(slot));

@@ -26,16 +26,17 @@ class OEBuilder;
 
 // What a field row stores.
 enum OEFieldKind : unsigned char {
-    OEFK_TEXT = 0,   // an OEString (or a bounded subclass: its spec length is the bound)
-    OEFK_AMOUNT,     // an OEPrecisionInteger
-    OEFK_DATETIME,   // an OEDateTime
-    OEFK_ENUM,       // an unsigned short index into the row's keyword table
-    OEFK_BOOL,       // an unsigned short flag written "Y" / "N"
-    OEFK_USHORT,     // an unsigned short number
-    OEFK_SLONG,      // a long
-    OEFK_ULONG,      // an unsigned long
-    OEFK_CHILD,      // one owned child aggregate (OEOwnedChild); rows may share one slot
-    OEFK_LIST        // an owned, ordered list of child aggregates (OEPtrArray<OEDataObj>)
+    OEFK_TEXT = 0, // an OEString (or a bounded subclass: its spec length is the bound)
+    OEFK_AMOUNT,   // an OEPrecisionInteger
+    OEFK_DATETIME, // an OEDateTime
+    OEFK_ENUM,     // an unsigned short index into the row's keyword table
+    OEFK_BOOL,     // an unsigned short flag written "Y" / "N"
+    OEFK_USHORT,   // an unsigned short number
+    OEFK_SLONG,    // a long
+    OEFK_ULONG,    // an unsigned long
+    OEFK_CHILD,    // one owned child aggregate (OEOwnedChild); rows may share one slot
+    OEFK_LIST,     // an owned, ordered list of child aggregates (OEPtrArray<OEDataObj>)
+    OEFK_TEXTLIST  // a repeated element: an OEDynamicArrayString, one element per entry
 };
 
 // A keyword table of an enumeration: keyword i is value i.
@@ -62,7 +63,7 @@ struct OEAggregateDesc {
     unsigned short m_validCount;
     const OETagRow* m_required;
     unsigned short m_requiredCount;
-    const OEFieldRow* m_fields;  // in build order
+    const OEFieldRow* m_fields; // in build order
     unsigned short m_fieldCount;
     // Filled on first use: for each field row, the position of its tag in the valid table (its
     // presence bit), or 0xFF. Lets Build test presence without searching the table per row.
@@ -75,11 +76,11 @@ struct OEAggregateDesc {
 // A creator that asks the factory for a new object, as an OEFieldRow wants it.
 #define OE_MAKE(op) [](OEDataObjFactory* f, unsigned short v) -> OEDataObj* { return f->op(v); }
 // A descriptor over the class's static tables (valid, required, fields).
-#define OE_DESC(tag, valid, required, fields)                                                                 \
-    OEAggregateDesc {                                                                                          \
-        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), required,                  \
-            static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields,                      \
-            static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                   \
+#define OE_DESC(tag, valid, required, fields)                                                                \
+    OEAggregateDesc {                                                                                        \
+        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), required,                 \
+            static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields,                     \
+            static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
     }
 
 typedef OEPtrArray<OEDataObj> OEDataObjList;
@@ -115,8 +116,11 @@ public:
     unsigned short GetNumberOfChildren() const override;
 
     // Copies every field and child of `other`, which must be of the same class (children are made
-    // through the factory). 1 on success; 0 for another class, no factory or no memory.
+    // through the factory), then calls CopyExtraFrom. 1 on success; 0 for another class, no
+    // factory or no memory.
     virtual unsigned short DeepCopyFrom(const OEAggregate* other);
+    // Hook: members that no field row describes (a hand-written list, say). Base: 1.
+    virtual unsigned short CopyExtraFrom(const OEAggregate* other);
 
     // The text form of a present element row (as the builder writes it, before escaping): 1, or
     // 0 for a child row or an element that is not present. For tools that show a tree.
@@ -138,7 +142,7 @@ protected:
     unsigned short SetText(OETagID tag, const OEString& value);
     unsigned short SetAmount(OETagID tag, const OEPrecisionInteger& value);
     unsigned short SetDateTime(OETagID tag, const OEDateTime& value);
-    unsigned short SetNumber(OETagID tag, unsigned long value);  // enum, bool, ushort, ulong
+    unsigned short SetNumber(OETagID tag, unsigned long value); // enum, bool, ushort, ulong
     unsigned short SetSigned(OETagID tag, long value);
     // Replaces the object in a child slot (the old one is deleted, the marks of every row that
     // shares the slot are cleared). A null child only clears. The new child is marked under its
@@ -153,10 +157,13 @@ protected:
     const OEString* GetText(OETagID tag) const;
     const OEPrecisionInteger* GetAmount(OETagID tag) const;
     const OEDateTime* GetDateTime(OETagID tag) const;
-    unsigned long GetNumber(OETagID tag) const;  // 0 when not marked
+    unsigned long GetNumber(OETagID tag) const; // 0 when not marked
     long GetSigned(OETagID tag) const;
     OEDataObj* GetChildObj(OETagID tag) const;
     OEDataObjList* GetList(OETagID tag) const;
+    OEDynamicArrayString* GetTextList(OETagID tag) const;
+    // Appends one entry to a repeated element and marks it.
+    unsigned short AppendText(OETagID tag, const OEString& value);
 
     // Builds one row (element or child) when it is present; the generic Build calls it per row.
     // Subclasses that write something in between override Build and call this.

@@ -5,8 +5,8 @@
 #include "messages/oeaccount.h"
 #include "messages/oetrans.h"
 
-extern OE_API const OEKeywordTable OEKW_BANKTXTYPE;      // TRNTYPE: "CREDIT" ... "OTHER" (17)
-extern OE_API const OEKeywordTable OEKW_CORRECTACTION;   // "REPLACE", "DELETE"
+extern OE_API const OEKeywordTable OEKW_BANKTXTYPE;    // TRNTYPE: "CREDIT" ... "OTHER" (17)
+extern OE_API const OEKeywordTable OEKW_CORRECTACTION; // "REPLACE", "DELETE"
 
 // STMTTRN: one statement transaction.
 class OE_API OEBankStatementTx : public OEAggregate {
@@ -37,7 +37,9 @@ public:
     unsigned short SetFITId(const OEString& v) { return SetFromText(OETAG_FITID, v); }
     const OEString* GetCorrectedFITId() const { return GetText(OETAG_CORRECTFITID); }
     unsigned short SetCorrectedFITId(const OEString& v) { return SetFromText(OETAG_CORRECTFITID, v); }
-    unsigned short GetCorrectAction() const { return static_cast<unsigned short>(GetNumber(OETAG_CORRECTACTION)); }
+    unsigned short GetCorrectAction() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_CORRECTACTION));
+    }
     unsigned short SetCorrectAction(const OEString& v) { return SetFromText(OETAG_CORRECTACTION, v); }
     unsigned short SetCorrectAction(unsigned short v) { return SetNumber(OETAG_CORRECTACTION, v); }
     const OEString* GetServerTxId() const { return GetText(OETAG_SRVRTID); }
@@ -143,13 +145,17 @@ public:
     unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
     const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
     unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OEBankAccount* GetAccountFrom() const { return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM)); }
+    OEBankAccount* GetAccountFrom() const {
+        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
+    }
     unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
     OEBankTransactionList* GetTransactionList() const {
         return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
     }
     unsigned short SetTransactionList(OEBankTransactionList* l) { return SetChildObj(OETAG_BANKTRANLIST, l); }
-    OELedgerBalance* GetLedgerBalance() const { return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL)); }
+    OELedgerBalance* GetLedgerBalance() const {
+        return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL));
+    }
     unsigned short SetLedgerBalance(OELedgerBalance* b) { return SetChildObj(OETAG_LEDGERBAL, b); }
     OEAvailableBalance* GetAvailableBalance() const {
         return static_cast<OEAvailableBalance*>(GetChildObj(OETAG_AVAILBAL));
@@ -176,7 +182,9 @@ public:
         return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
     }
     unsigned short SetTransactionList(OEBankTransactionList* l) { return SetChildObj(OETAG_BANKTRANLIST, l); }
-    OELedgerBalance* GetLedgerBalance() const { return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL)); }
+    OELedgerBalance* GetLedgerBalance() const {
+        return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL));
+    }
     unsigned short SetLedgerBalance(OELedgerBalance* b) { return SetChildObj(OETAG_LEDGERBAL, b); }
     OEAvailableBalance* GetAvailableBalance() const {
         return static_cast<OEAvailableBalance*>(GetChildObj(OETAG_AVAILBAL));
@@ -192,7 +200,9 @@ public:
 class OE_API OEGenericStatementRq : public OETransBase {
 public:
     explicit OEGenericStatementRq(unsigned short version = 0) : OETransBase(version) {}
-    OEIncTransaction* GetIncTransaction() const { return static_cast<OEIncTransaction*>(GetChildObj(OETAG_INCTRAN)); }
+    OEIncTransaction* GetIncTransaction() const {
+        return static_cast<OEIncTransaction*>(GetChildObj(OETAG_INCTRAN));
+    }
     unsigned short SetIncTransaction(OEIncTransaction* inc) { return SetChildObj(OETAG_INCTRAN, inc); }
     // A repeated account or INCTRAN logs OEPW_EXTRAAGG and replaces the old object; the new one
     // comes from the factory with version 0 (the factory's own).
@@ -206,7 +216,9 @@ class OE_API OEBankStatementRq : public OEGenericStatementRq {
 public:
     explicit OEBankStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankAccount* GetAccountFrom() const { return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM)); }
+    OEBankAccount* GetAccountFrom() const {
+        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
+    }
     unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
 };
 

@@ -12,7 +12,9 @@ public:
     unsigned short SetCurrencyRate(const OEPrecisionInteger& v) { return SetAmount(OETAG_CURRATE, v); }
     const OEString* GetCurrencySymbol() const { return GetText(OETAG_CURSYM); }
     // An empty text returns 3 and marks nothing; a text longer than 3 is kept and logged.
-    unsigned short SetCurrencySymbol(const OEString& v) { return v.IsEmpty() ? 3 : SetFromText(OETAG_CURSYM, v); }
+    unsigned short SetCurrencySymbol(const OEString& v) {
+        return v.IsEmpty() ? 3 : SetFromText(OETAG_CURSYM, v);
+    }
 
     OEPrecisionInteger m_curRate;
     OEString3 m_curSym;

@@ -13,42 +13,56 @@ namespace {
 // Every message set (request side), its wrapper tags and its children in build order. The
 // response side is the same with RS for RQ, except where noted.
 struct Family {
-    OETagID m_v1, m_v2;  // m_v2 is 0 for a set that exists only as V1
+    OETagID m_v1, m_v2; // m_v2 is 0 for a set that exists only as V1
     std::vector<OETagID> m_rq;
-    std::vector<OETagID> m_rsExtra;  // response-only children, appended after the mirrored ones
+    std::vector<OETagID> m_rsExtra; // response-only children, appended after the mirrored ones
 };
 
 const std::vector<Family>& Families() {
     static const std::vector<Family> families = {
-        {OETAG_SIGNONMSGSRQV1, OETAG_SIGNONMSGSRQV2, {OETAG_SONRQ, OETAG_PINCHTRNRQ, OETAG_CHALLENGETRNRQ}, {}},
+        {OETAG_SIGNONMSGSRQV1,
+         OETAG_SIGNONMSGSRQV2,
+         {OETAG_SONRQ, OETAG_PINCHTRNRQ, OETAG_CHALLENGETRNRQ},
+         {}},
         {OETAG_SIGNUPMSGSRQV1,
          OETAG_SIGNUPMSGSRQV2,
-         {OETAG_ENROLLTRNRQ, OETAG_ACCTINFOTRNRQ, OETAG_CHGUSERINFOTRNRQ, OETAG_CHGUSERINFOSYNCRQ, OETAG_ACCTTRNRQ,
-          OETAG_ACCTSYNCRQ},
+         {OETAG_ENROLLTRNRQ, OETAG_ACCTINFOTRNRQ, OETAG_CHGUSERINFOTRNRQ, OETAG_CHGUSERINFOSYNCRQ,
+          OETAG_ACCTTRNRQ, OETAG_ACCTSYNCRQ},
          {}},
         {OETAG_BANKMSGSRQV1,
          OETAG_BANKMSGSRQV2,
          {OETAG_STMTTRNRQ, OETAG_STMTENDTRNRQ, OETAG_INTRATRNRQ, OETAG_RECINTRATRNRQ, OETAG_STPCHKTRNRQ,
-          OETAG_BANKMAILTRNRQ, OETAG_BANKMAILSYNCRQ, OETAG_STPCHKSYNCRQ, OETAG_INTRASYNCRQ, OETAG_RECINTRASYNCRQ},
+          OETAG_BANKMAILTRNRQ, OETAG_BANKMAILSYNCRQ, OETAG_STPCHKSYNCRQ, OETAG_INTRASYNCRQ,
+          OETAG_RECINTRASYNCRQ},
          {}},
         {OETAG_CREDITCARDMSGSRQV1, OETAG_CREDITCARDMSGSRQV2, {OETAG_CCSTMTTRNRQ, OETAG_CCSTMTENDTRNRQ}, {}},
-        {OETAG_INVSTMTMSGSRQV1, OETAG_INVSTMTMSGSRQV2, {OETAG_INVSTMTTRNRQ, OETAG_INVMAILTRNRQ, OETAG_INVMAILSYNCRQ}, {}},
+        {OETAG_INVSTMTMSGSRQV1,
+         OETAG_INVSTMTMSGSRQV2,
+         {OETAG_INVSTMTTRNRQ, OETAG_INVMAILTRNRQ, OETAG_INVMAILSYNCRQ},
+         {}},
         {OETAG_INTERXFERMSGSRQV1,
          OETAG_INTERXFERMSGSRQV2,
-         {OETAG_INTERTRNRQ, OETAG_MULTIINTERTRNRQ, OETAG_RECINTERTRNRQ, OETAG_INTERSYNCRQ, OETAG_RECINTERSYNCRQ},
+         {OETAG_INTERTRNRQ, OETAG_MULTIINTERTRNRQ, OETAG_RECINTERTRNRQ, OETAG_INTERSYNCRQ,
+          OETAG_RECINTERSYNCRQ},
          {}},
         {OETAG_WIREXFERMSGSRQV1, OETAG_WIREXFERMSGSRQV2, {OETAG_WIRETRNRQ, OETAG_WIRESYNCRQ}, {}},
         {OETAG_BILLPAYMSGSRQV1,
          OETAG_BILLPAYMSGSRQV2,
-         {OETAG_PAYEETRNRQ, OETAG_PAYEESYNCRQ, OETAG_PMTTRNRQ, OETAG_RECPMTTRNRQ, OETAG_PMTINQTRNRQ, OETAG_PMTMAILTRNRQ,
-          OETAG_PMTSYNCRQ, OETAG_RECPMTSYNCRQ, OETAG_PMTMAILSYNCRQ},
+         {OETAG_PAYEETRNRQ, OETAG_PAYEESYNCRQ, OETAG_PMTTRNRQ, OETAG_RECPMTTRNRQ, OETAG_PMTINQTRNRQ,
+          OETAG_PMTMAILTRNRQ, OETAG_PMTSYNCRQ, OETAG_RECPMTSYNCRQ, OETAG_PMTMAILSYNCRQ},
          {}},
-        {OETAG_EMAILMSGSRQV1, OETAG_EMAILMSGSRQV2, {OETAG_MAILTRNRQ, OETAG_MAILSYNCRQ, OETAG_GETMIMETRNRQ}, {}},
+        {OETAG_EMAILMSGSRQV1,
+         OETAG_EMAILMSGSRQV2,
+         {OETAG_MAILTRNRQ, OETAG_MAILSYNCRQ, OETAG_GETMIMETRNRQ},
+         {}},
         // The security list (SECLIST) of the response side is held by a class that is not part of
         // the library yet; until it is, the parser skips it as not valid here.
         {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {}},
         {OETAG_PROFMSGSRQV1, OETAG_PROFMSGSRQV2, {OETAG_PROFTRNRQ}, {}},
-        {OETAG_KEST_BRANDMSGSRQV1, OETAG_KEST_BRANDMSGSRQV2, {OETAG_KEST_BRANDTRNRQ, OETAG_KEST_MKTTIERTRNRQ}, {}},
+        {OETAG_KEST_BRANDMSGSRQV1,
+         OETAG_KEST_BRANDMSGSRQV2,
+         {OETAG_KEST_BRANDTRNRQ, OETAG_KEST_MKTTIERTRNRQ},
+         {}},
         {OETAG_KEST_SWREGMSGSRQV1, OETAG_KEST_SWREGMSGSRQV2, {OETAG_KEST_SWREGTRNRQ}, {}},
         {OETAG_KEST_CLOGMSGSRQV1, OETAG_KEST_CLOGMSGSRQV2, {OETAG_KEST_CLIENTLOGTRNRQ}, {}},
         {OETAG_KEST_SURVEYMSGSRQV1, OETAG_KEST_SURVEYMSGSRQV2, {OETAG_KEST_SURVEYTRNRQ}, {}},
@@ -95,7 +109,7 @@ const WrapperTables* TablesOf(OETagID wrapper) {
 }
 
 bool IsSyncTag(OETagID tag) {
-    if (tag == OETAG_K_PAYROLLUPDATERQ) return true;  // an update request travels with the syncs
+    if (tag == OETAG_K_PAYROLLUPDATERQ) return true; // an update request travels with the syncs
     OETagDictionary* d = OETagDictionary::TheOETagDictionary();
     const char* name = d ? d->GetTagString(tag) : nullptr;
     size_t n = name ? std::strlen(name) : 0;
@@ -127,7 +141,8 @@ const OETagRow kRootRqValid[] = {
 const std::vector<OETagRow>& RootRsValid() {
     static const std::vector<OETagRow> rows = [] {
         std::vector<OETagRow> out;
-        for (const OETagRow& r : kRootRqValid) out.push_back(OETagRow{OEResponseTagOf(r.m_tag), r.m_versionMask, 0});
+        for (const OETagRow& r : kRootRqValid)
+            out.push_back(OETagRow{OEResponseTagOf(r.m_tag), r.m_versionMask, 0});
         return out;
     }();
     return rows;
@@ -135,15 +150,15 @@ const std::vector<OETagRow>& RootRsValid() {
 
 // The fixed build order of the roots: sign-on first, the security list after e-mail.
 const OETagID kRootBuildOrder[] = {
-    OETAG_SIGNONMSGSRQV1,      OETAG_SIGNONMSGSRQV2,      OETAG_SIGNUPMSGSRQV1,      OETAG_SIGNUPMSGSRQV2,
-    OETAG_BANKMSGSRQV1,        OETAG_BANKMSGSRQV2,        OETAG_CREDITCARDMSGSRQV1,  OETAG_CREDITCARDMSGSRQV2,
-    OETAG_INVSTMTMSGSRQV1,     OETAG_INVSTMTMSGSRQV2,     OETAG_INTERXFERMSGSRQV1,   OETAG_INTERXFERMSGSRQV2,
-    OETAG_WIREXFERMSGSRQV1,    OETAG_WIREXFERMSGSRQV2,    OETAG_BILLPAYMSGSRQV1,     OETAG_BILLPAYMSGSRQV2,
-    OETAG_EMAILMSGSRQV1,       OETAG_EMAILMSGSRQV2,       OETAG_SECLISTMSGSRQV1,     OETAG_SECLISTMSGSRQV2,
-    OETAG_PROFMSGSRQV1,        OETAG_PROFMSGSRQV2,        OETAG_KEST_BRANDMSGSRQV1,  OETAG_KEST_BRANDMSGSRQV2,
-    OETAG_KEST_SWREGMSGSRQV1,  OETAG_KEST_SWREGMSGSRQV2,  OETAG_KEST_CLOGMSGSRQV1,   OETAG_KEST_CLOGMSGSRQV2,
-    OETAG_KEST_SURVEYMSGSRQV1, OETAG_KEST_SURVEYMSGSRQV2, OETAG_KEST_USLFIMSGSRQV1,  OETAG_KEST_USLFIMSGSRQV2,
-    OETAG_KEST_USLCUMSGSRQV1,  OETAG_KEST_USLCUMSGSRQV2,  OETAG_K_PAYROLLMSGSRQV1,   OETAG_K_EFILEMSGSRQV1};
+    OETAG_SIGNONMSGSRQV1,      OETAG_SIGNONMSGSRQV2,      OETAG_SIGNUPMSGSRQV1,     OETAG_SIGNUPMSGSRQV2,
+    OETAG_BANKMSGSRQV1,        OETAG_BANKMSGSRQV2,        OETAG_CREDITCARDMSGSRQV1, OETAG_CREDITCARDMSGSRQV2,
+    OETAG_INVSTMTMSGSRQV1,     OETAG_INVSTMTMSGSRQV2,     OETAG_INTERXFERMSGSRQV1,  OETAG_INTERXFERMSGSRQV2,
+    OETAG_WIREXFERMSGSRQV1,    OETAG_WIREXFERMSGSRQV2,    OETAG_BILLPAYMSGSRQV1,    OETAG_BILLPAYMSGSRQV2,
+    OETAG_EMAILMSGSRQV1,       OETAG_EMAILMSGSRQV2,       OETAG_SECLISTMSGSRQV1,    OETAG_SECLISTMSGSRQV2,
+    OETAG_PROFMSGSRQV1,        OETAG_PROFMSGSRQV2,        OETAG_KEST_BRANDMSGSRQV1, OETAG_KEST_BRANDMSGSRQV2,
+    OETAG_KEST_SWREGMSGSRQV1,  OETAG_KEST_SWREGMSGSRQV2,  OETAG_KEST_CLOGMSGSRQV1,  OETAG_KEST_CLOGMSGSRQV2,
+    OETAG_KEST_SURVEYMSGSRQV1, OETAG_KEST_SURVEYMSGSRQV2, OETAG_KEST_USLFIMSGSRQV1, OETAG_KEST_USLFIMSGSRQV2,
+    OETAG_KEST_USLCUMSGSRQV1,  OETAG_KEST_USLCUMSGSRQV2,  OETAG_K_PAYROLLMSGSRQV1,  OETAG_K_EFILEMSGSRQV1};
 
 // Copies the tree of one list entry into a fresh object (transaction wrapper or sync).
 template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
@@ -157,7 +172,9 @@ template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
 OEMessageSetBase::OEMessageSetBase(unsigned short version, bool request)
     : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr) {}
 
-OEMessageSetBase::~OEMessageSetBase() { delete m_signOn; }
+OEMessageSetBase::~OEMessageSetBase() {
+    delete m_signOn;
+}
 
 unsigned short OEMessageSetBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
     const WrapperTables* t = TablesOf(GetType());
@@ -311,8 +328,9 @@ unsigned short OEMessageSetBase::AllRequiredPresent() {
         return ValidateTag(OETAG_SECLIST) || m_trans.Entries() > 0;
     }
     // The bill payment sets stay on the last rule on purpose.
-    if (starts("BANKMSGSR") || starts("CREDITCARDMSGSR") || starts("INVSTMTMSGSR") || starts("INTERXFERMSGSR") ||
-        starts("WIREXFERMSGSR") || starts("EMAILMSGSR") || starts("SIGNUPMSGSR") || starts("KEST."))
+    if (starts("BANKMSGSR") || starts("CREDITCARDMSGSR") || starts("INVSTMTMSGSR") ||
+        starts("INTERXFERMSGSR") || starts("WIREXFERMSGSR") || starts("EMAILMSGSR") ||
+        starts("SIGNUPMSGSR") || starts("KEST."))
         return AnyValidPresent();
     return m_trans.Entries() > 0 || m_sync.Entries() > 0;
 }
@@ -351,9 +369,11 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
                                                        : CopyEntry(static_cast<OESyncRs*>(dst), src));
             if (!ok) return 0;
             if (pass == 0 && m_request)
-                static_cast<OETransRq*>(dst)->SetMsgsRqTag(static_cast<const OETransRq*>(src)->GetMsgsRqTag());
+                static_cast<OETransRq*>(dst)->SetMsgsRqTag(
+                    static_cast<const OETransRq*>(src)->GetMsgsRqTag());
             if (pass == 0 && !m_request)
-                static_cast<OETransRs*>(dst)->SetMsgsRsTag(static_cast<const OETransRs*>(src)->GetMsgsRsTag());
+                static_cast<OETransRs*>(dst)->SetMsgsRsTag(
+                    static_cast<const OETransRs*>(src)->GetMsgsRsTag());
         }
     }
     return CopyBaseMembersFrom(other);
@@ -398,7 +418,8 @@ unsigned short OEMessageSetRq::DeepCopyFrom(const OEMessageSetRq* other) {
             m_signOn = factory->NewSignOnRq(other->m_signOn->GetMsgSetVersion());
             if (!m_signOn) return 0;
         }
-        if (!static_cast<OESignOnRq*>(m_signOn)->DeepCopyFrom(static_cast<const OESignOnRq*>(other->m_signOn)))
+        if (!static_cast<OESignOnRq*>(m_signOn)->DeepCopyFrom(
+                static_cast<const OESignOnRq*>(other->m_signOn)))
             return 0;
     } else if (m_signOn) {
         delete m_signOn;
@@ -508,7 +529,8 @@ unsigned short OEMessageSetRs::DeepCopyFrom(const OEMessageSetRs* other) {
             m_signOn = factory->NewSignOnRs(other->m_signOn->GetMsgSetVersion());
             if (!m_signOn) return 0;
         }
-        if (!static_cast<OESignOnRs*>(m_signOn)->DeepCopyFrom(static_cast<const OESignOnRs*>(other->m_signOn)))
+        if (!static_cast<OESignOnRs*>(m_signOn)->DeepCopyFrom(
+                static_cast<const OESignOnRs*>(other->m_signOn)))
             return 0;
     } else if (m_signOn) {
         delete m_signOn;
@@ -520,7 +542,8 @@ unsigned short OEMessageSetRs::DeepCopyFrom(const OEMessageSetRs* other) {
 
 // ================================================================ roots
 
-OERootBase::OERootBase(unsigned short version, bool request) : OEDataObj(version), m_request(request), m_sets(4, 4) {}
+OERootBase::OERootBase(unsigned short version, bool request)
+    : OEDataObj(version), m_request(request), m_sets(4, 4) {}
 
 OERootBase::~OERootBase() {}
 
@@ -557,8 +580,9 @@ OEParseStatus OERootBase::PushMsgObject(OETagID tag) {
             return OEPS_INVALID;
         }
     }
-    OEMessageSetBase* set = m_request ? static_cast<OEMessageSetBase*>(factory->NewMessageSetRq(OEDataObj::GetMsgSetVersion()))
-                                      : static_cast<OEMessageSetBase*>(factory->NewMessageSetRs(OEDataObj::GetMsgSetVersion()));
+    OEMessageSetBase* set =
+        m_request ? static_cast<OEMessageSetBase*>(factory->NewMessageSetRq(OEDataObj::GetMsgSetVersion()))
+                  : static_cast<OEMessageSetBase*>(factory->NewMessageSetRs(OEDataObj::GetMsgSetVersion()));
     if (!set) return OEPS_NORESOURCE;
     set->SetType(tag);
     if (!m_sets.Append(set)) {
@@ -607,7 +631,8 @@ unsigned short OERootBase::AllRequiredPresent() {
     OETagID v2 = m_request ? OETAG_SIGNONMSGSRQV2 : OETAG_SIGNONMSGSRSV2;
     bool signOn = false;
     for (unsigned short i = 0; i < m_sets.Entries(); ++i)
-        if (m_sets.Get(i) && (m_sets.Get(i)->GetType() == v1 || m_sets.Get(i)->GetType() == v2)) signOn = true;
+        if (m_sets.Get(i) && (m_sets.Get(i)->GetType() == v1 || m_sets.Get(i)->GetType() == v2))
+            signOn = true;
     return signOn && m_sets.Entries() > 0;
 }
 
@@ -616,7 +641,8 @@ unsigned short OERootBase::CopyFrom(const OERootBase* other) {
     if (other == this) return 1;
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
-    while (m_sets.Entries() > other->m_sets.Entries()) m_sets.Delete(static_cast<unsigned short>(m_sets.Entries() - 1));
+    while (m_sets.Entries() > other->m_sets.Entries())
+        m_sets.Delete(static_cast<unsigned short>(m_sets.Entries() - 1));
     for (unsigned short i = m_sets.Entries(); i < other->m_sets.Entries(); ++i) {
         OEMessageSetBase* fresh = m_request ? static_cast<OEMessageSetBase*>(factory->NewMessageSetRq(0))
                                             : static_cast<OEMessageSetBase*>(factory->NewMessageSetRs(0));
@@ -629,8 +655,10 @@ unsigned short OERootBase::CopyFrom(const OERootBase* other) {
         const OEMessageSetBase* src = other->m_sets.Get(i);
         OEMessageSetBase* dst = m_sets.Get(i);
         if (!src || !dst) return 0;
-        unsigned short ok = m_request ? static_cast<OEMessageSetRq*>(dst)->DeepCopyFrom(static_cast<const OEMessageSetRq*>(src))
-                                      : static_cast<OEMessageSetRs*>(dst)->DeepCopyFrom(static_cast<const OEMessageSetRs*>(src));
+        unsigned short ok =
+            m_request
+                ? static_cast<OEMessageSetRq*>(dst)->DeepCopyFrom(static_cast<const OEMessageSetRq*>(src))
+                : static_cast<OEMessageSetRs*>(dst)->DeepCopyFrom(static_cast<const OEMessageSetRs*>(src));
         if (!ok) return 0;
     }
     return CopyBaseMembersFrom(other);

@@ -53,16 +53,22 @@ public:
     explicit OEMessageSetRq(unsigned short version = 0) : OEMessageSetBase(version, true) {}
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
 
-    unsigned short SetTrans(unsigned short index, OETransRq* trans) { return StoreTrans(index, trans, false); }
+    unsigned short SetTrans(unsigned short index, OETransRq* trans) {
+        return StoreTrans(index, trans, false);
+    }
     unsigned short AppendTrans(OETransRq* trans) { return StoreTrans(0, trans, true); }
     OETransRq* GetTrans(unsigned short index) const { return static_cast<OETransRq*>(m_trans.Get(index)); }
-    OETransRq* DisconnectTrans(unsigned short index) { return static_cast<OETransRq*>(Disconnect(m_trans, index)); }
+    OETransRq* DisconnectTrans(unsigned short index) {
+        return static_cast<OETransRq*>(Disconnect(m_trans, index));
+    }
     // Index above the count is refused; equal to the count appends. The set's version goes to the
     // object and its children, and the object's tag is marked here.
     unsigned short SetSync(unsigned short index, OESyncRq* sync) { return StoreSync(index, sync, false); }
     unsigned short AppendSync(OESyncRq* sync) { return StoreSync(0, sync, true); }
     OESyncRq* GetSync(unsigned short index) const { return static_cast<OESyncRq*>(m_sync.Get(index)); }
-    OESyncRq* DisconnectSync(unsigned short index) { return static_cast<OESyncRq*>(Disconnect(m_sync, index)); }
+    OESyncRq* DisconnectSync(unsigned short index) {
+        return static_cast<OESyncRq*>(Disconnect(m_sync, index));
+    }
 
     OESignOnRq* GetSignOnRq() const { return static_cast<OESignOnRq*>(m_signOn); }
     // Deletes the held object, clears the SONRQ mark only when `signOn` is null, stores it, and
@@ -84,10 +90,14 @@ public:
     explicit OEMessageSetRs(unsigned short version = 0) : OEMessageSetBase(version, false) {}
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
 
-    unsigned short SetTrans(unsigned short index, OETransRs* trans) { return StoreTrans(index, trans, false); }
+    unsigned short SetTrans(unsigned short index, OETransRs* trans) {
+        return StoreTrans(index, trans, false);
+    }
     unsigned short AppendTrans(OETransRs* trans) { return StoreTrans(0, trans, true); }
     OETransRs* GetTrans(unsigned short index) const { return static_cast<OETransRs*>(m_trans.Get(index)); }
-    OETransRs* DisconnectTrans(unsigned short index) { return static_cast<OETransRs*>(Disconnect(m_trans, index)); }
+    OETransRs* DisconnectTrans(unsigned short index) {
+        return static_cast<OETransRs*>(Disconnect(m_trans, index));
+    }
     unsigned short SetSync(unsigned short index, OESyncRs* sync) { return StoreSync(index, sync, false); }
     unsigned short AppendSync(OESyncRs* sync) { return StoreSync(0, sync, true); }
     OESyncRs* GetSync(unsigned short index) const { return static_cast<OESyncRs*>(m_sync.Get(index)); }
@@ -136,7 +146,9 @@ public:
         return static_cast<OEMessageSetRq*>(m_sets.Get(index));
     }
     unsigned short AppendMessageSet(OEMessageSetRq* set) { return Store(0, set, true); }
-    unsigned short SetMessageSet(unsigned short index, OEMessageSetRq* set) { return Store(index, set, false); }
+    unsigned short SetMessageSet(unsigned short index, OEMessageSetRq* set) {
+        return Store(index, set, false);
+    }
     unsigned short DeepCopyFrom(const OERequest* other) { return CopyFrom(other); }
 };
 
@@ -148,7 +160,9 @@ public:
         return static_cast<OEMessageSetRs*>(m_sets.Get(index));
     }
     unsigned short AppendMessageSet(OEMessageSetRs* set) { return Store(0, set, true); }
-    unsigned short SetMessageSet(unsigned short index, OEMessageSetRs* set) { return Store(index, set, false); }
+    unsigned short SetMessageSet(unsigned short index, OEMessageSetRs* set) {
+        return Store(index, set, false);
+    }
     unsigned short DeepCopyFrom(const OEResponse* other) { return CopyFrom(other); }
 };
 

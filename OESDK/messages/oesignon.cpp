@@ -42,9 +42,8 @@ const OETagRow kSonRsValid[] = {
     {OETAG_USERKEY, OEVM_ALL, 0},         {OETAG_TSKEYEXPIRE, OEVM_ALL, 0}, {OETAG_SESSCOOKIE, OEVM_ALL, 0},
     {OETAG_KEST_MKTCOOKIE, OEVM_ALL, 0},  {OETAG_KEST_BID, OEVM_ALL, 0},    {OETAG_KEST_USERID, OEVM_ALL, 0},
     {OETAG_KEST_PRESENCEID, OEVM_ALL, 0}, {OETAG_COUNTRY, OEVM_NOTV1, 0}};
-const OETagRow kSonRsRequired[] = {{OETAG_STATUS, OEVM_ALL, 0},
-                                   {OETAG_DTSERVER, OEVM_ALL, 0},
-                                   {OETAG_LANGUAGE, OEVM_ALL, 0}};
+const OETagRow kSonRsRequired[] = {
+    {OETAG_STATUS, OEVM_ALL, 0}, {OETAG_DTSERVER, OEVM_ALL, 0}, {OETAG_LANGUAGE, OEVM_ALL, 0}};
 const OEFieldRow kSonRsFields[] = {
     {OETAG_STATUS, OEFK_CHILD, OE_MEMBER(OESignOnRs, m_status), nullptr, OE_MAKE(NewStatus)},
     {OETAG_DTSERVER, OEFK_DATETIME, OE_MEMBER(OESignOnRs, m_dtServer), nullptr, nullptr},
@@ -84,13 +83,23 @@ const unsigned kLastDictionaryTag = 1447;
 
 } // namespace
 
-OEPassword::~OEPassword() { Clear(0); }
+OEPassword::~OEPassword() {
+    Clear(0);
+}
 
-OEFI::OEFI(unsigned short version) : OEAggregate(version) { SetType(OETAG_FI); }
-const OEAggregateDesc& OEFI::Describe() const { return kFIDesc; }
+OEFI::OEFI(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_FI);
+}
+const OEAggregateDesc& OEFI::Describe() const {
+    return kFIDesc;
+}
 
-OESignOnRq::OESignOnRq(unsigned short version) : OEAggregate(version) { SetType(OETAG_SONRQ); }
-const OEAggregateDesc& OESignOnRq::Describe() const { return kSonRqDesc; }
+OESignOnRq::OESignOnRq(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_SONRQ);
+}
+const OEAggregateDesc& OESignOnRq::Describe() const {
+    return kSonRqDesc;
+}
 
 OEParseStatus OESignOnRq::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
     if (!entry || entry->m_id > kLastDictionaryTag) return OEPS_INVALID;
@@ -103,11 +112,23 @@ unsigned short OESignOnRq::AllRequiredPresent() {
     return ValidateTag(OETAG_USERKEY);
 }
 
-OESignOnRs::OESignOnRs(unsigned short version) : OEAggregate(version) { SetType(OETAG_SONRS); }
-const OEAggregateDesc& OESignOnRs::Describe() const { return kSonRsDesc; }
+OESignOnRs::OESignOnRs(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_SONRS);
+}
+const OEAggregateDesc& OESignOnRs::Describe() const {
+    return kSonRsDesc;
+}
 
-OEPinChangeRq::OEPinChangeRq(unsigned short version) : OETransBase(version) { SetType(OETAG_PINCHRQ); }
-const OEAggregateDesc& OEPinChangeRq::Describe() const { return kPinRqDesc; }
+OEPinChangeRq::OEPinChangeRq(unsigned short version) : OETransBase(version) {
+    SetType(OETAG_PINCHRQ);
+}
+const OEAggregateDesc& OEPinChangeRq::Describe() const {
+    return kPinRqDesc;
+}
 
-OEPinChangeRs::OEPinChangeRs(unsigned short version) : OETransBase(version) { SetType(OETAG_PINCHRS); }
-const OEAggregateDesc& OEPinChangeRs::Describe() const { return kPinRsDesc; }
+OEPinChangeRs::OEPinChangeRs(unsigned short version) : OETransBase(version) {
+    SetType(OETAG_PINCHRS);
+}
+const OEAggregateDesc& OEPinChangeRs::Describe() const {
+    return kPinRsDesc;
+}

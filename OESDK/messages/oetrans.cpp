@@ -174,35 +174,30 @@ const OEFieldRow kWarningFields[] = {
 // ---- synchronisation wrappers ----
 // The transaction wrappers that a synchronisation aggregate may repeat.
 const OETagID kSyncWrappers[] = {
-    OETAG_ACCTTRNRQ,    OETAG_BANKMAILTRNRQ, OETAG_CHGUSERINFOTRNRQ, OETAG_INTERTRNRQ,  OETAG_INTRATRNRQ,
-    OETAG_INVMAILTRNRQ, OETAG_MAILTRNRQ,     OETAG_PAYEETRNRQ,       OETAG_PMTMAILTRNRQ, OETAG_PMTTRNRQ,
-    OETAG_RECINTERTRNRQ, OETAG_RECINTRATRNRQ, OETAG_RECPMTTRNRQ,     OETAG_STPCHKTRNRQ,  OETAG_WIRETRNRQ,
+    OETAG_ACCTTRNRQ,      OETAG_BANKMAILTRNRQ, OETAG_CHGUSERINFOTRNRQ, OETAG_INTERTRNRQ,   OETAG_INTRATRNRQ,
+    OETAG_INVMAILTRNRQ,   OETAG_MAILTRNRQ,     OETAG_PAYEETRNRQ,       OETAG_PMTMAILTRNRQ, OETAG_PMTTRNRQ,
+    OETAG_RECINTERTRNRQ,  OETAG_RECINTRATRNRQ, OETAG_RECPMTTRNRQ,      OETAG_STPCHKTRNRQ,  OETAG_WIRETRNRQ,
     OETAG_K_PAYROLLTRNRQ, OETAG_K_EFILETRNRQ};
 
-#define OE_SYNC_WRAPPER_ROWS(S)                                                                               \
-    {OETAG_ACCTTRN##S, OEVM_ALL, 0}, {OETAG_BANKMAILTRN##S, OEVM_ALL, 0},                                     \
-        {OETAG_CHGUSERINFOTRN##S, OEVM_ALL, 0}, {OETAG_INTERTRN##S, OEVM_ALL, 0},                             \
-        {OETAG_INTRATRN##S, OEVM_ALL, 0}, {OETAG_INVMAILTRN##S, OEVM_ALL, 0}, {OETAG_MAILTRN##S, OEVM_ALL, 0}, \
-        {OETAG_PAYEETRN##S, OEVM_ALL, 0}, {OETAG_PMTMAILTRN##S, OEVM_ALL, 0}, {OETAG_PMTTRN##S, OEVM_ALL, 0},  \
-        {OETAG_RECINTERTRN##S, OEVM_ALL, 0}, {OETAG_RECINTRATRN##S, OEVM_ALL, 0},                             \
-        {OETAG_RECPMTTRN##S, OEVM_ALL, 0}, {OETAG_STPCHKTRN##S, OEVM_ALL, 0},                                 \
-        {OETAG_WIRETRN##S, OEVM_ALL, 0}, {OETAG_K_PAYROLLTRN##S, OEVM_ALL, 0},                                \
-        {OETAG_K_EFILETRN##S, OEVM_ALL, 0}
+#define OE_SYNC_WRAPPER_ROWS(S)                                                                              \
+    {OETAG_ACCTTRN##S, OEVM_ALL, 0}, {OETAG_BANKMAILTRN##S, OEVM_ALL, 0},                                    \
+        {OETAG_CHGUSERINFOTRN##S, OEVM_ALL, 0}, {OETAG_INTERTRN##S, OEVM_ALL, 0},                            \
+        {OETAG_INTRATRN##S, OEVM_ALL, 0}, {OETAG_INVMAILTRN##S, OEVM_ALL, 0},                                \
+        {OETAG_MAILTRN##S, OEVM_ALL, 0}, {OETAG_PAYEETRN##S, OEVM_ALL, 0},                                   \
+        {OETAG_PMTMAILTRN##S, OEVM_ALL, 0}, {OETAG_PMTTRN##S, OEVM_ALL, 0},                                  \
+        {OETAG_RECINTERTRN##S, OEVM_ALL, 0}, {OETAG_RECINTRATRN##S, OEVM_ALL, 0},                            \
+        {OETAG_RECPMTTRN##S, OEVM_ALL, 0}, {OETAG_STPCHKTRN##S, OEVM_ALL, 0},                                \
+        {OETAG_WIRETRN##S, OEVM_ALL, 0}, {OETAG_K_PAYROLLTRN##S, OEVM_ALL, 0}, {                             \
+        OETAG_K_EFILETRN##S, OEVM_ALL, 0                                                                     \
+    }
 
-const OETagRow kSyncRqValid[] = {{OETAG_TOKEN, OEVM_ALL, 0},
-                                 {OETAG_TOKEN2, OEVM_ALL, 0},
-                                 {OETAG_TOKENONLY, OEVM_ALL, 0},
-                                 {OETAG_REFRESH, OEVM_ALL, 0},
-                                 {OETAG_REJECTIFMISSING, OEVM_ALL, 0},
-                                 {OETAG_INCIMAGES, OEVM_ALL, 0},
-                                 {OETAG_USEHTML, OEVM_ALL, 0},
-                                 {OETAG_SYNCERROR, OEVM_ALL, 0},
-                                 {OETAG_KEST_REFRESH, OEVM_ALL, 0},
-                                 {OETAG_KEST_SYNCERROR, OEVM_ALL, 0},
-                                 {OETAG_BANKACCTFROM, OEVM_ALL, 0},
-                                 {OETAG_CCACCTFROM, OEVM_ALL, 0},
-                                 {OETAG_INVACCTFROM, OEVM_ALL, 0},
-                                 OE_SYNC_WRAPPER_ROWS(RQ)};
+const OETagRow kSyncRqValid[] = {{OETAG_TOKEN, OEVM_ALL, 0},           {OETAG_TOKEN2, OEVM_ALL, 0},
+                                 {OETAG_TOKENONLY, OEVM_ALL, 0},       {OETAG_REFRESH, OEVM_ALL, 0},
+                                 {OETAG_REJECTIFMISSING, OEVM_ALL, 0}, {OETAG_INCIMAGES, OEVM_ALL, 0},
+                                 {OETAG_USEHTML, OEVM_ALL, 0},         {OETAG_SYNCERROR, OEVM_ALL, 0},
+                                 {OETAG_KEST_REFRESH, OEVM_ALL, 0},    {OETAG_KEST_SYNCERROR, OEVM_ALL, 0},
+                                 {OETAG_BANKACCTFROM, OEVM_ALL, 0},    {OETAG_CCACCTFROM, OEVM_ALL, 0},
+                                 {OETAG_INVACCTFROM, OEVM_ALL, 0},     OE_SYNC_WRAPPER_ROWS(RQ)};
 const OETagRow kSyncRqRequired[] = {{OETAG_REJECTIFMISSING, OEVM_ALL, 0}};
 const OEFieldRow kSyncRqFields[] = {
     {OETAG_TOKEN, OEFK_TEXT, OE_MEMBER(OESyncRq, m_token), nullptr, nullptr},
@@ -248,7 +243,8 @@ const OEFieldRow kSyncRsFields[] = {
 };
 
 template <size_t NR, size_t NF>
-OEAggregateDesc WrapperDesc(const std::vector<OETagRow>& valid, const OETagRow (&required)[NR], const OEFieldRow (&fields)[NF]) {
+OEAggregateDesc WrapperDesc(const std::vector<OETagRow>& valid, const OETagRow (&required)[NR],
+                            const OEFieldRow (&fields)[NF]) {
     return OEAggregateDesc{OETAG_NONE,
                            valid.data(),
                            static_cast<unsigned short>(valid.size()),
@@ -288,10 +284,14 @@ const OEAggregateDesc kStatusDesc = OE_DESC(OETAG_STATUS, kStatusValid, kStatusR
 const OEAggregateDesc kWarningDesc = OE_DESC(OETAG_WARNING, kWarningValid, kWarningValid, kWarningFields);
 const OEAggregateDesc kSyncRqDesc = OE_DESC(OETAG_NONE, kSyncRqValid, kSyncRqRequired, kSyncRqFields);
 // No generic required rows: the token rule below is the whole check.
-const OEAggregateDesc kSyncRsDesc = {OETAG_NONE,    kSyncRsValid,
-                                     static_cast<unsigned short>(sizeof(kSyncRsValid) / sizeof(kSyncRsValid[0])),
-                                     kNoRows,       0,
-                                     kSyncRsFields, static_cast<unsigned short>(sizeof(kSyncRsFields) / sizeof(kSyncRsFields[0]))};
+const OEAggregateDesc kSyncRsDesc = {
+    OETAG_NONE,
+    kSyncRsValid,
+    static_cast<unsigned short>(sizeof(kSyncRsValid) / sizeof(kSyncRsValid[0])),
+    kNoRows,
+    0,
+    kSyncRsFields,
+    static_cast<unsigned short>(sizeof(kSyncRsFields) / sizeof(kSyncRsFields[0]))};
 
 bool IsSyncWrapper(OETagID tag, bool response) {
     for (OETagID t : kSyncWrappers)
@@ -299,7 +299,9 @@ bool IsSyncWrapper(OETagID tag, bool response) {
     return false;
 }
 
-unsigned short ExactlyOne(unsigned short a, unsigned short b) { return (a ? 1 : 0) + (b ? 1 : 0) == 1 ? 1 : 0; }
+unsigned short ExactlyOne(unsigned short a, unsigned short b) {
+    return (a ? 1 : 0) + (b ? 1 : 0) == 1 ? 1 : 0;
+}
 
 } // namespace
 
@@ -323,8 +325,12 @@ OETagID OEResponseTagOf(OETagID requestTag) {
 
 // ---------------------------------------------------------------- OEStatus
 
-OEStatus::OEStatus(unsigned short version) : OEAggregate(version) { SetType(OETAG_STATUS); }
-const OEAggregateDesc& OEStatus::Describe() const { return kStatusDesc; }
+OEStatus::OEStatus(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_STATUS);
+}
+const OEAggregateDesc& OEStatus::Describe() const {
+    return kStatusDesc;
+}
 
 unsigned short OEStatus::SetCode(const OEString& text) {
     const char* s = text.c_str();
@@ -346,7 +352,9 @@ unsigned short OEStatus::SetCode(const OEString& text) {
     return SetCode(static_cast<long>(value));
 }
 
-unsigned short OEStatus::SetCode(long code) { return SetSigned(OETAG_CODE, code); }
+unsigned short OEStatus::SetCode(long code) {
+    return SetSigned(OETAG_CODE, code);
+}
 
 unsigned short OEStatus::SetSeverity(const OEString& text) {
     for (unsigned short i = 0; i < 3; ++i) {
@@ -380,13 +388,19 @@ OEParseStatus OEStatus::HandleTagElement(const OETagDictionaryEntry* entry, cons
 
 // ---------------------------------------------------------------- OEWarning
 
-OEWarning::OEWarning(unsigned short version) : OEAggregate(version) { SetType(OETAG_WARNING); }
-const OEAggregateDesc& OEWarning::Describe() const { return kWarningDesc; }
+OEWarning::OEWarning(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_WARNING);
+}
+const OEAggregateDesc& OEWarning::Describe() const {
+    return kWarningDesc;
+}
 
 // ---------------------------------------------------------------- OETransRq
 
 OETransRq::OETransRq(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRq::Describe() const { return TransRqDesc(); }
+const OEAggregateDesc& OETransRq::Describe() const {
+    return TransRqDesc();
+}
 
 OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
     for (const InnerRow& r : kInner)
@@ -437,7 +451,9 @@ unsigned short OETransRq::AllRequiredPresent() {
 // ---------------------------------------------------------------- OETransRs
 
 OETransRs::OETransRs(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRs::Describe() const { return TransRsDesc(); }
+const OEAggregateDesc& OETransRs::Describe() const {
+    return TransRsDesc();
+}
 
 unsigned short OETransRs::SetActualTrans(OETransBase* inner) {
     if (!inner) return SetChildObj(OETAG_STMTRS, nullptr);
@@ -454,7 +470,8 @@ OETransBase* OETransRs::DisconnectActualTrans() {
 
 unsigned short OETransRs::IsErrorStatus() const {
     const OEStatus* s = GetStatus();
-    return ValidateTag(OETAG_STATUS) && s && s->ValidateTag(OETAG_SEVERITY) && s->GetSeverity() == OESEV_ERROR;
+    return ValidateTag(OETAG_STATUS) && s && s->ValidateTag(OETAG_SEVERITY) &&
+           s->GetSeverity() == OESEV_ERROR;
 }
 
 unsigned short OETransRs::IsUpToDate() const {
@@ -500,7 +517,7 @@ unsigned short OETransRs::AllRequiredPresent() {
     if (n < 2 || n > 62) return 1;
     char rq[64];
     std::memcpy(rq, name, n);
-    rq[n - 1] = 'Q';  // the wrappers end in TRNRS
+    rq[n - 1] = 'Q'; // the wrappers end in TRNRS
     OETagID rqTag = OETAG_NONE;
     if (!dictionary->GetTagID(rq, static_cast<unsigned short>(n), &rqTag, OECaseSensitive)) return 1;
     const RequiredInner* r = FindRequiredInner(rqTag);
@@ -515,7 +532,9 @@ unsigned short OETransRs::AllRequiredPresent() {
 // ---------------------------------------------------------------- OESyncRq
 
 OESyncRq::OESyncRq(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
-const OEAggregateDesc& OESyncRq::Describe() const { return kSyncRqDesc; }
+const OEAggregateDesc& OESyncRq::Describe() const {
+    return kSyncRqDesc;
+}
 
 OETagID OESyncRq::MsgIDToSyncWrapper(OETagID tag) {
     switch (tag) {
@@ -569,7 +588,8 @@ OETagID OESyncRq::MsgIDToSyncWrapper(OETagID tag) {
 
 unsigned short OESyncRq::SetAccount(OEDataObj* account) {
     if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM, account);
+    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
+                       account);
 }
 
 unsigned short OESyncRq::AppendTrans(OETransRq* trans) {
@@ -661,11 +681,14 @@ unsigned short OESyncRq::GetNumberOfChildren() const {
 // ---------------------------------------------------------------- OESyncRs
 
 OESyncRs::OESyncRs(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
-const OEAggregateDesc& OESyncRs::Describe() const { return kSyncRsDesc; }
+const OEAggregateDesc& OESyncRs::Describe() const {
+    return kSyncRsDesc;
+}
 
 unsigned short OESyncRs::SetAccount(OEDataObj* account) {
     if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM, account);
+    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
+                       account);
 }
 
 unsigned short OESyncRs::AppendTrans(OETransRs* trans) {
@@ -727,8 +750,9 @@ unsigned short OESyncRs::AllRequiredPresent() {
     case OETAG_INTERSYNCRS:
         return ExactlyOne(bank, cc);
     case OETAG_K_PAYROLLUPDATERS:
-        return ValidateTag(OETAG_TOKEN) && ValidateTag(OETAG_K_PAYCHKNEXTID) && ValidateTag(OETAG_K_PAYROLLTXNEXTID) &&
-               ValidateTag(OETAG_K_EMPNEXTID) && ValidateTag(OETAG_K_PITEMNEXTID);
+        return ValidateTag(OETAG_TOKEN) && ValidateTag(OETAG_K_PAYCHKNEXTID) &&
+               ValidateTag(OETAG_K_PAYROLLTXNEXTID) && ValidateTag(OETAG_K_EMPNEXTID) &&
+               ValidateTag(OETAG_K_PITEMNEXTID);
     default:
         return 1;
     }
@@ -742,4 +766,41 @@ OEDataObj* OESyncRs::GetChild(unsigned short index) const {
 
 unsigned short OESyncRs::GetNumberOfChildren() const {
     return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
+}
+
+namespace {
+
+// Copies a list of wrappers (the wrappers' own tags and children included) through the factory.
+template <class T> unsigned short CopyWrappers(OEDataObjList& to, const OEDataObjList& from, bool request) {
+    to.DeleteAll();
+    OEDataObjFactory* factory = OEDataObj::GetFactory();
+    if (!factory) return 0;
+    for (unsigned short i = 0; i < from.Entries(); ++i) {
+        const T* src = static_cast<const T*>(from.Get(i));
+        if (!src) continue;
+        T* copy =
+            request ? static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRq(src->GetMsgSetVersion())))
+                    : static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRs(src->GetMsgSetVersion())));
+        if (!copy) return 0;
+        if (!to.Append(copy)) {
+            delete copy;
+            return 0;
+        }
+        if (!copy->DeepCopyFrom(src)) return 0;
+    }
+    return 1;
+}
+
+} // namespace
+
+unsigned short OESyncRq::CopyExtraFrom(const OEAggregate* other) {
+    const OESyncRq* src = static_cast<const OESyncRq*>(other);
+    m_msgsTag = src->m_msgsTag;
+    return CopyWrappers<OETransRq>(m_trans, src->m_trans, true);
+}
+
+unsigned short OESyncRs::CopyExtraFrom(const OEAggregate* other) {
+    const OESyncRs* src = static_cast<const OESyncRs*>(other);
+    m_msgsTag = src->m_msgsTag;
+    return CopyWrappers<OETransRs>(m_trans, src->m_trans, false);
 }

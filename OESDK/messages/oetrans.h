@@ -69,7 +69,9 @@ public:
     unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
     const OEString* GetTAN() const { return GetText(OETAG_TAN); }
     unsigned short SetTAN(const OEString& v) { return SetFromText(OETAG_TAN, v); }
-    unsigned short GetSyncCompleteInfo() const { return static_cast<unsigned short>(GetNumber(OETAG_SYNCCOMPLETEINFO)); }
+    unsigned short GetSyncCompleteInfo() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_SYNCCOMPLETEINFO));
+    }
     unsigned short SetSyncCompleteInfo(const OEString& v) { return SetFromText(OETAG_SYNCCOMPLETEINFO, v); }
     unsigned short SetSyncCompleteInfo(unsigned short v) { return SetNumber(OETAG_SYNCCOMPLETEINFO, v); }
     OETagID GetMsgsRqTag() const { return m_msgsTag; }
@@ -79,6 +81,10 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransRq*>(other)->m_msgsTag;
+        return 1;
+    }
 
     OEOwnedChild m_actual;
     OEString36 m_trnUid;
@@ -119,6 +125,10 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransRs*>(other)->m_msgsTag;
+        return 1;
+    }
 
     OEOwnedChild m_actual, m_status, m_warning;
     OEString36 m_trnUid;
@@ -143,15 +153,21 @@ public:
     unsigned short SetTokenOnly(unsigned short v) { return SetNumber(OETAG_TOKENONLY, v); }
     unsigned short GetRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_REFRESH)); }
     unsigned short SetRefresh(unsigned short v) { return SetNumber(OETAG_REFRESH, v); }
-    unsigned short GetRejectIfMissing() const { return static_cast<unsigned short>(GetNumber(OETAG_REJECTIFMISSING)); }
+    unsigned short GetRejectIfMissing() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_REJECTIFMISSING));
+    }
     unsigned short SetRejectIfMissing(unsigned short v) { return SetNumber(OETAG_REJECTIFMISSING, v); }
-    unsigned short GetIncludeImages() const { return static_cast<unsigned short>(GetNumber(OETAG_INCIMAGES)); }
+    unsigned short GetIncludeImages() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_INCIMAGES));
+    }
     unsigned short SetIncludeImages(unsigned short v) { return SetNumber(OETAG_INCIMAGES, v); }
     unsigned short GetUseHTML() const { return static_cast<unsigned short>(GetNumber(OETAG_USEHTML)); }
     unsigned short SetUseHTML(unsigned short v) { return SetNumber(OETAG_USEHTML, v); }
     unsigned long GetSyncError() const { return GetNumber(OETAG_SYNCERROR); }
     unsigned short SetSyncError(unsigned long v) { return SetNumber(OETAG_SYNCERROR, v); }
-    unsigned short GetKestRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_KEST_REFRESH)); }
+    unsigned short GetKestRefresh() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_KEST_REFRESH));
+    }
     unsigned short SetKestRefresh(unsigned short v) { return SetNumber(OETAG_KEST_REFRESH, v); }
     unsigned short SetKestSyncError(unsigned long v) { return SetNumber(OETAG_KEST_SYNCERROR, v); }
     OEDataObj* GetAccount() const { return m_account.get(); }
@@ -172,6 +188,7 @@ public:
     unsigned short AllRequiredPresent() override;
     OEDataObj* GetChild(unsigned short index) const override;
     unsigned short GetNumberOfChildren() const override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
     OEString m_token, m_token2;
     unsigned short m_tokenOnly = 0, m_refresh = 0, m_rejectIfMissing = 0, m_incImages = 0, m_useHtml = 0;
@@ -212,6 +229,7 @@ public:
     unsigned short AllRequiredPresent() override;
     OEDataObj* GetChild(unsigned short index) const override;
     unsigned short GetNumberOfChildren() const override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
     OEString m_token, m_token2;
     unsigned short m_lostSync = 0, m_kestRefresh = 0;

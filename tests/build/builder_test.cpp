@@ -21,7 +21,9 @@ public:
     }
 };
 
-std::string Text(OEBuffer& b) { return std::string(b.GetBufferPtr() ? b.GetBufferPtr() : "", b.GetBufferSize()); }
+std::string Text(OEBuffer& b) {
+    return std::string(b.GetBufferPtr() ? b.GetBufferPtr() : "", b.GetBufferSize());
+}
 
 // A builder bound to a fresh buffer, ready for direct writer calls.
 struct Bound {
@@ -58,7 +60,7 @@ TEST(Builder, LineEndOptionTable) {
     }
     Bound lf(OEBCL_LF);
     EXPECT_EQ(lf.builder.AddHeader(OEHT_VERSION, OEString("102")), OEBS_OK);
-    EXPECT_EQ(lf.builder.AddHeader(OEHT_SECURITY, OEString("")), OEBS_OK);  // empty: nothing
+    EXPECT_EQ(lf.builder.AddHeader(OEHT_SECURITY, OEString("")), OEBS_OK); // empty: nothing
     EXPECT_EQ(lf.text(), "VERSION:102\n") << "no space after the colon";
     Bound none(OEBCL_NONE);
     none.builder.AddHeader(OEHT_OFXHEADER, OEString("100"));
@@ -83,7 +85,8 @@ TEST(Builder, EscapingCdataAndBlankValues) {
 
     Bound blank;
     EXPECT_EQ(blank.builder.AddTagOEString(OETAG_MEMO, OEString("   ")), OEBS_BLANKVALUE);
-    EXPECT_EQ(blank.builder.AddString(static_cast<const OEString*>(nullptr), OEBSM_NONE, OEBCL_NONE), OEBS_BLANKVALUE);
+    EXPECT_EQ(blank.builder.AddString(static_cast<const OEString*>(nullptr), OEBSM_NONE, OEBCL_NONE),
+              OEBS_BLANKVALUE);
     EXPECT_EQ(blank.text(), "");
 }
 
@@ -99,7 +102,7 @@ TEST(Builder, StrictAndLenientStrings) {
     EXPECT_EQ(lenient.builder.AddTagOEString(OETAG_NAME, tooLong), OEBS_OK);
     EXPECT_EQ(lenient.text(), "<NAME>" + std::string(32, 'z') + "\n");
 
-    OELanguage bad("E1G");  // invalid, but not too long
+    OELanguage bad("E1G"); // invalid, but not too long
     Bound strict2;
     EXPECT_EQ(strict2.builder.AddString(bad, OEBSM_NONE, OEBCL_NONE), OEBS_INVALIDSTRING);
     Bound lenient2(OEBCL_CRLF, 0, OEBSO_LENIENT);

@@ -9,7 +9,9 @@
 
 namespace {
 
-OEDataObjFactory* F() { return OEDataObj::GetFactory(); }
+OEDataObjFactory* F() {
+    return OEDataObj::GetFactory();
+}
 
 std::string Build(OEDataObj* root, OEBuildStringCrLfOpt crlf = OEBCL_CRLF, int* status = nullptr) {
     OEBuffer buffer(0, 4096);
@@ -29,7 +31,8 @@ OEParseStatus Parse(const std::string& text, OEDataObj* root) {
 unsigned short CountLogged(OEParseWarning code) {
     OEParseLogger* log = OEParseLogger::TheOEParseLogger();
     unsigned short n = 0;
-    for (unsigned short i = 0; i < log->GetNumberParseExceptions(); ++i) n += log->GetParseException(i)->GetCode() == code;
+    for (unsigned short i = 0; i < log->GetNumberParseExceptions(); ++i)
+        n += log->GetParseException(i)->GetCode() == code;
     return n;
 }
 
@@ -38,7 +41,8 @@ TEST(File, DefaultHeadersAndVersionChoice) {
     OERequest* rq = F()->NewRequest(1);
     file->AppendRequest(rq);
     EXPECT_EQ(Build(file.get()),
-              "OFXHEADER:100\r\nDATA:OFXSGML\r\nVERSION:102\r\nSECURITY:NONE\r\nENCODING:USASCII\r\nCHARSET:1252\r\n"
+              "OFXHEADER:100\r\nDATA:OFXSGML\r\nVERSION:102\r\nSECURITY:NONE\r\nENCODING:USASCII\r\nCHARSET:"
+              "1252\r\n"
               "COMPRESSION:NONE\r\nOLDFILEUID:NONE\r\nNEWFILEUID:NONE\r\n\r\n<OFX>\n</OFX>\n");
     file->SetMFAHeaderRequired(1);
     EXPECT_NE(Build(file.get()).find("VERSION:103\r\n"), std::string::npos);
@@ -61,8 +65,8 @@ TEST(File, ValidationIsDeliberatelyLenient) {
         unsigned short badFormat;
     };
     const Row rows[] = {
-        {"OFXHEADER:100\nDATA:ofxsgml\nVERSION:102\n", 1, 0},  // values are upper-cased first
-        {"OFXHEADER:100\nDATA:OFXSGML\nVERSION:211\n", 1, 1},  // reported, tolerated
+        {"OFXHEADER:100\nDATA:ofxsgml\nVERSION:102\n", 1, 0}, // values are upper-cased first
+        {"OFXHEADER:100\nDATA:OFXSGML\nVERSION:211\n", 1, 1}, // reported, tolerated
         {"OFXHEADER:100\nDATA:OFXSGML\nENCODING:EBCDIC\n", 0, 1},
         {"OFXHEADER:100\nDATA:XML\n", 0, 1},
         {"OFXHEADER:200\nCOMPRESSION:ZIP\n", 0, 2},
@@ -82,12 +86,15 @@ TEST(File, ValidationIsDeliberatelyLenient) {
 
 TEST(File, MimeHeadersBlankValuesAndElementsUnderTheFile) {
     std::unique_ptr<OEFileRs> file(F()->NewFileRs(1));
-    EXPECT_EQ(Parse("CONTENT-TYPE:application/x-ofx\nOFXHEADER:100\nSECURITY:\n\n<OFX></OFX>", file.get()), OEPS_OK);
+    EXPECT_EQ(Parse("CONTENT-TYPE:application/x-ofx\nOFXHEADER:100\nSECURITY:\n\n<OFX></OFX>", file.get()),
+              OEPS_OK);
     ASSERT_EQ(file->GetNumMIMEHeaders(), 1);
-    EXPECT_STREQ(file->GetMIMEHeader(static_cast<unsigned short>(0))->GetValue().c_str(), "application/x-ofx");
+    EXPECT_STREQ(file->GetMIMEHeader(static_cast<unsigned short>(0))->GetValue().c_str(),
+                 "application/x-ofx");
     EXPECT_EQ(file->GetHeader(OEHT_CONTENTTYPE), nullptr);
     EXPECT_EQ(file->GetHeader(OEHT_SECURITY), nullptr) << "a blank value is ignored";
-    EXPECT_NE(Build(file.get()).find("CONTENT-TYPE: application/x-ofx\r\n\r\nOFXHEADER:100"), std::string::npos);
+    EXPECT_NE(Build(file.get()).find("CONTENT-TYPE: application/x-ofx\r\n\r\nOFXHEADER:100"),
+              std::string::npos);
 
     std::unique_ptr<OEFileRs> bad(F()->NewFileRs(1));
     EXPECT_EQ(Parse("OFXHEADER:100\n\n<TRNUID>5\n<OFX></OFX>", bad.get()), OEPS_INVALID);

@@ -10,7 +10,9 @@ using namespace msgtest;
 
 namespace {
 
-OEDataObjFactory* F() { return OEDataObj::GetFactory(); }
+OEDataObjFactory* F() {
+    return OEDataObj::GetFactory();
+}
 
 OEMessageSetRq* Set(OETagID tag) {
     OEMessageSetRq* set = F()->NewMessageSetRq(1);
@@ -34,14 +36,15 @@ TEST(Envelope, RootWritesSignOnFirstAndRefusesDuplicateSets) {
     trn->SetType(OETAG_STMTTRNRQ);
     trn->SetTransUserID(OEString("1"));
     bank->AppendTrans(trn);
-    rq->AppendMessageSet(bank);  // appended before the sign-on set
+    rq->AppendMessageSet(bank); // appended before the sign-on set
     OEMessageSetRq* signOn = Set(OETAG_SIGNONMSGSRQV1);
     rq->AppendMessageSet(signOn);
     EXPECT_EQ(rq->AllRequiredPresent(), 1);
     std::string text = BuildText(rq.get());
     EXPECT_LT(text.find("<SIGNONMSGSRQV1>"), text.find("<BANKMSGSRQV1>"));
-    EXPECT_EQ(text, "<SIGNONMSGSRQV1>\n</SIGNONMSGSRQV1>\n<BANKMSGSRQV1>\n<STMTTRNRQ>\n<TRNUID>1\n</STMTTRNRQ>\n"
-                    "</BANKMSGSRQV1>\n");
+    EXPECT_EQ(text,
+              "<SIGNONMSGSRQV1>\n</SIGNONMSGSRQV1>\n<BANKMSGSRQV1>\n<STMTTRNRQ>\n<TRNUID>1\n</STMTTRNRQ>\n"
+              "</BANKMSGSRQV1>\n");
 
     rq->AppendMessageSet(Set(OETAG_BANKMSGSRQV1));
     int status = 0;
@@ -79,7 +82,7 @@ TEST(Envelope, NullSignOnLeavesTheMarkSetAndWritesNothing) {
     EXPECT_EQ(set->DisconnectSignOnRq(), 1);
     EXPECT_EQ(set->GetSignOnRq(), nullptr);
     EXPECT_EQ(set->ValidateTag(OETAG_SONRQ), 0);
-    delete mine;  // handed back to us
+    delete mine; // handed back to us
 }
 
 TEST(Envelope, DeepCopyClearsTheResponseMarkNotSonrq) {
@@ -92,7 +95,8 @@ TEST(Envelope, DeepCopyClearsTheResponseMarkNotSonrq) {
     // tried to clear SONRS, which is not a tag of a request set: it is logged as unknown.
     bool loggedUnknown = false;
     for (unsigned short i = 0; i < LogCount(); ++i)
-        if (LogEntry(i)->GetCode() == OEPW_UNKNOWNTAG && LogEntry(i)->GetTag() == OETAG_SONRS) loggedUnknown = true;
+        if (LogEntry(i)->GetCode() == OEPW_UNKNOWNTAG && LogEntry(i)->GetTag() == OETAG_SONRS)
+            loggedUnknown = true;
     EXPECT_TRUE(loggedUnknown);
 
     OETransRq* trn = F()->NewTransRq(1);
@@ -123,7 +127,7 @@ TEST(Envelope, InnerRequestMaps) {
     };
     const Row rows[] = {
         {OETAG_STMTRQ, OETAG_BANKMSGSET, OETAG_STMTTRNRQ, OETAG_NONE},
-        {OETAG_MAILRQ, OETAG_NONE, OETAG_MAILTRNRQ, OETAG_NONE},  // the e-mail row keys on the wrapper
+        {OETAG_MAILRQ, OETAG_NONE, OETAG_MAILTRNRQ, OETAG_NONE}, // the e-mail row keys on the wrapper
         {OETAG_MAILTRNRQ, OETAG_EMAILMSGSET, OETAG_NONE, OETAG_NONE},
         {OETAG_INTRACANRQ, OETAG_BANKMSGSET, OETAG_INTRATRNRQ, OETAG_INTRASYNCRQ},
         {OETAG_CCSTMTRQ, OETAG_CREDITCARDMSGSET, OETAG_CCSTMTTRNRQ, OETAG_NONE},
@@ -139,13 +143,15 @@ TEST(Envelope, InnerRequestMaps) {
 }
 
 TEST(Envelope, ParsedChildrenAreRoutedAndDuplicatesHandled) {
-    const char* text =
-        "<OFX><SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</STATUS><DTSERVER>20240105<LANGUAGE>ENG</SONRS>"
-        "<SONRS><STATUS><CODE>0<SEVERITY>INFO</STATUS><DTSERVER>20240106<LANGUAGE>ENG</SONRS></SIGNONMSGSRSV1>"
-        "<BANKMSGSRSV1><STMTTRNRS><TRNUID>1<STATUS><CODE>1<SEVERITY>INFO</STATUS></STMTTRNRS>"
-        "<INTRASYNCRS><TOKEN>5<BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS</BANKACCTFROM>"
-        "<INTRATRNRS><TRNUID>2<STATUS><CODE>0<SEVERITY>INFO</STATUS></INTRATRNRS></INTRASYNCRS></BANKMSGSRSV1>"
-        "<BANKMSGSRSV1><STMTTRNRS><TRNUID>3</STMTTRNRS></BANKMSGSRSV1></OFX>";
+    const char* text = "<OFX><SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</"
+                       "STATUS><DTSERVER>20240105<LANGUAGE>ENG</SONRS>"
+                       "<SONRS><STATUS><CODE>0<SEVERITY>INFO</STATUS><DTSERVER>20240106<LANGUAGE>ENG</"
+                       "SONRS></SIGNONMSGSRSV1>"
+                       "<BANKMSGSRSV1><STMTTRNRS><TRNUID>1<STATUS><CODE>1<SEVERITY>INFO</STATUS></STMTTRNRS>"
+                       "<INTRASYNCRS><TOKEN>5<BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS</BANKACCTFROM>"
+                       "<INTRATRNRS><TRNUID>2<STATUS><CODE>0<SEVERITY>INFO</STATUS></INTRATRNRS></"
+                       "INTRASYNCRS></BANKMSGSRSV1>"
+                       "<BANKMSGSRSV1><STMTTRNRS><TRNUID>3</STMTTRNRS></BANKMSGSRSV1></OFX>";
     std::unique_ptr<OEFileRs> file(F()->NewFileRs(1));
     OEParseStatus status = ParseInto(text, file.get());
     EXPECT_EQ(status, OEPS_INVALID) << "a second BANKMSGSRSV1 is refused";
@@ -177,8 +183,10 @@ TEST(Status, CodeRangeAndSeverityWords) {
         unsigned short accepted;
         OEParseWarning logged;
     };
-    const Row codes[] = {{"-99999", 1, OEPW_UNKNOWNEXCEPTION}, {"999999", 1, OEPW_UNKNOWNEXCEPTION},
-                         {"-100000", 0, OEPW_TOOLONG},         {"1000000", 0, OEPW_TOOLONG},
+    const Row codes[] = {{"-99999", 1, OEPW_UNKNOWNEXCEPTION},
+                         {"999999", 1, OEPW_UNKNOWNEXCEPTION},
+                         {"-100000", 0, OEPW_TOOLONG},
+                         {"1000000", 0, OEPW_TOOLONG},
                          {"12a", 0, OEPW_BADFORMAT}};
     for (const Row& r : codes) {
         OEParseLogger::TheOEParseLogger()->DeleteAll();
@@ -219,17 +227,17 @@ TEST(TransactionWrappers, RequiredInnerRulesIncludingTheKeptExclusiveOr) {
     const Row rows[] = {
         {OETAG_INTRATRNRQ, {OETAG_INTRARQ}, 1},
         {OETAG_INTRATRNRQ, {OETAG_INTRARQ, OETAG_INTRAMODRQ}, 0},
-        {OETAG_INTRATRNRQ, {OETAG_INTRARQ, OETAG_INTRAMODRQ, OETAG_INTRACANRQ}, 1},  // kept as it is
+        {OETAG_INTRATRNRQ, {OETAG_INTRARQ, OETAG_INTRAMODRQ, OETAG_INTRACANRQ}, 1}, // kept as it is
         {OETAG_WIRETRNRQ, {OETAG_WIRERQ, OETAG_WIRECANRQ}, 0},
         {OETAG_STMTTRNRQ, {OETAG_STMTRQ}, 1},
         {OETAG_STMTTRNRQ, {OETAG_CCSTMTRQ}, 0},
-        {OETAG_PROFTRNRQ, {}, 1},  // no rule for this wrapper
+        {OETAG_PROFTRNRQ, {}, 1}, // no rule for this wrapper
     };
     for (const Row& r : rows) {
         std::unique_ptr<OETransRq> trn(F()->NewTransRq(1));
         trn->SetType(r.wrapper);
         trn->SetTransUserID(OEString("1"));
-        trn->SetActualTrans(F()->NewBankStatementRq(1));  // some inner object must exist
+        trn->SetActualTrans(F()->NewBankStatementRq(1)); // some inner object must exist
         trn->ClearTag(OETAG_STMTRQ);
         for (OETagID t : r.marks) trn->SetTag(t);
         EXPECT_EQ(trn->AllRequiredPresent(), r.expected) << r.wrapper << " with " << r.marks.size();
@@ -259,9 +267,10 @@ TEST(TransactionWrappers, ResponseNeedsItsInnerUnlessErrorOrUpToDate) {
 
 TEST(TransactionWrappers, InnerTagsWithoutAClassAnswerFour) {
     std::unique_ptr<OEFileRs> rs(F()->NewFileRs(1));
-    OEParseStatus status = ParseInto("<OFX><INVSTMTMSGSRSV1><INVSTMTTRNRS><TRNUID>1<STATUS><CODE>0<SEVERITY>INFO"
-                                     "</STATUS><INVSTMTRS><CURDEF>USD</INVSTMTRS></INVSTMTTRNRS></INVSTMTMSGSRSV1></OFX>",
-                                     rs.get());
+    OEParseStatus status =
+        ParseInto("<OFX><INVSTMTMSGSRSV1><INVSTMTTRNRS><TRNUID>1<STATUS><CODE>0<SEVERITY>INFO"
+                  "</STATUS><INVSTMTRS><CURDEF>USD</INVSTMTRS></INVSTMTTRNRS></INVSTMTMSGSRSV1></OFX>",
+                  rs.get());
     EXPECT_EQ(status, OEPS_INVALID);
 }
 
@@ -274,7 +283,7 @@ TEST(Sync, ChoiceRules) {
         {{OETAG_REJECTIFMISSING, OETAG_TOKEN}, 1},
         {{OETAG_REJECTIFMISSING, OETAG_REFRESH}, 1},
         {{OETAG_REJECTIFMISSING, OETAG_TOKEN, OETAG_REFRESH}, 0},
-        {{OETAG_REJECTIFMISSING, OETAG_TOKEN, OETAG_TOKEN2}, 0},  // the two tokens cancel
+        {{OETAG_REJECTIFMISSING, OETAG_TOKEN, OETAG_TOKEN2}, 0}, // the two tokens cancel
         {{OETAG_TOKEN}, 0},
     };
     for (const Row& r : rows) {
@@ -307,14 +316,52 @@ TEST(SignOn, CredentialsRuleVersionTwoElementsAndBuildOrder) {
     fi->SetOrg(OEString("B"));
     s->SetFI(fi);
     s->SetSessCookie(OEString("c"));
-    EXPECT_EQ(BuildText(s.get()), "<DTCLIENT>20240105\n<USERID>me\n<USERPASS>secret\n<USERKEY>key\n<LANGUAGE>ENG\n"
-                                  "<FI>\n<ORG>B\n</FI>\n<SESSCOOKIE>c\n<APPID>QWIN\n<APPVER>2700\n");
+    EXPECT_EQ(BuildText(s.get()),
+              "<DTCLIENT>20240105\n<USERID>me\n<USERPASS>secret\n<USERKEY>key\n<LANGUAGE>ENG\n"
+              "<FI>\n<ORG>B\n</FI>\n<SESSCOOKIE>c\n<APPID>QWIN\n<APPVER>2700\n");
     std::unique_ptr<OESignOnRq> v2(F()->NewSignOnRq(2));
     EXPECT_EQ(v2->SetCountry(OEString("USA")), 1);
     EXPECT_EQ(v2->SetOneTimePass(OEString("123456")), 1);
     std::string longPass(171, 'p');
     EXPECT_EQ(v2->SetUserPass(OEString(longPass.c_str())), 1);
     EXPECT_NE(BuildText(v2.get()).find(longPass), std::string::npos);
+}
+
+} // namespace
+
+namespace {
+
+TEST(Profile, MessageSetCoreRequiredByVersionAndRepeatedElements) {
+    OEDataObjFactory* f = OEDataObj::GetFactory();
+    for (unsigned short version : {1, 2}) {
+        std::unique_ptr<OEMessageSetCore> core(f->NewMessageSetCore(version));
+        core->SetVer(1L);
+        core->SetOFXSecurity(OEString("type1"));
+        core->SetTransportSecurity(OEString("Y"));
+        core->SetSignOnRealm(OEString("R"));
+        core->SetSyncMode(OEString("LITE"));
+        core->SetRespFileer(OEString("N"));
+        core->AppendLanguage(OEString("ENG"));
+        core->AppendLanguage(OEString("FRA"));
+        EXPECT_EQ(core->AllRequiredPresent(), 0) << version;
+        EXPECT_EQ(core->SetURL(OEString("https://v1")), version == 1 ? 1 : 0);
+        EXPECT_EQ(core->SetURL2(OEString("https://v2")), version == 2 ? 1 : 0);
+        EXPECT_EQ(core->AppendCountry(OEString("USA")), version == 2 ? 1 : 0);
+        EXPECT_EQ(core->AllRequiredPresent(), 1) << version;
+        std::string text = BuildText(core.get());
+        EXPECT_NE(text.find("<LANGUAGE>ENG\n<LANGUAGE>FRA\n"), std::string::npos);
+        std::unique_ptr<OEMessageSetCore> copy(f->NewMessageSetCore(version));
+        ASSERT_EQ(copy->DeepCopyFrom(core.get()), 1);
+        EXPECT_EQ(BuildText(copy.get()), text);
+    }
+    std::unique_ptr<OEMessageSetList> list(f->NewMessageSetList(1));
+    OEMessageSetProfile* bank = f->NewMessageSetProfile(1);
+    bank->SetType(OETAG_BANKMSGSET);
+    ASSERT_NE(bank->NewMsgSetVersion(OETAG_BANKMSGSETV1, 1), nullptr);
+    EXPECT_EQ(bank->NewMsgSetVersion(OETAG_STMTRQ, 1), nullptr);
+    list->SetMessageSetProfile(bank);
+    EXPECT_EQ(list->AllRequiredPresent(), 0) << "SIGNONMSGSET and PROFMSGSET are required";
+    EXPECT_EQ(BuildText(list.get()), "<BANKMSGSET>\n<BANKMSGSETV1>\n</BANKMSGSETV1>\n</BANKMSGSET>\n");
 }
 
 } // namespace

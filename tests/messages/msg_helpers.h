@@ -14,8 +14,10 @@ namespace msgtest {
 class FaithfulBuilder : public OEBuilder {
 public:
     FaithfulBuilder(unsigned short endTags) : OEBuilder(OEBCL_LF, endTags) {}
-    OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros, OEBuildStringCrLfOpt crlf) override {
-        if (!value.ExceedsSpecLength() && value.GetEncoding() != OESE_CDATA) return OEBuilder::AddString(value, macros, crlf);
+    OEBuildStatus AddString(const OEString& value, OEBuildStringMacroOpt macros,
+                            OEBuildStringCrLfOpt crlf) override {
+        if (!value.ExceedsSpecLength() && value.GetEncoding() != OESE_CDATA)
+            return OEBuilder::AddString(value, macros, crlf);
         OEString whole(value);
         if (value.GetEncoding() == OESE_CDATA) {
             whole = (std::string("<![CDATA[") + value.c_str() + "]]>").c_str();
@@ -54,8 +56,12 @@ inline bool ReadFile(const std::string& path, std::string& text) {
     return true;
 }
 
-inline OEParseException* LogEntry(unsigned short i) { return OEParseLogger::TheOEParseLogger()->GetParseException(i); }
-inline unsigned short LogCount() { return OEParseLogger::TheOEParseLogger()->GetNumberParseExceptions(); }
+inline OEParseException* LogEntry(unsigned short i) {
+    return OEParseLogger::TheOEParseLogger()->GetParseException(i);
+}
+inline unsigned short LogCount() {
+    return OEParseLogger::TheOEParseLogger()->GetNumberParseExceptions();
+}
 
 } // namespace msgtest
 
