@@ -44,13 +44,10 @@ int Run(int argc, char** argv) {
         std::fprintf(stderr, "oesdk convert: writing failed with build status %d\n", status);
         return 1;
     }
-    FILE* out = outPath ? std::fopen(outPath, "wb") : stdout;
-    if (!out) {
-        std::fprintf(stderr, "oesdk convert: cannot write %s\n", outPath);
+    if (!WriteOutput(outPath, text)) {
+        std::fprintf(stderr, "oesdk convert: cannot write %s\n", outPath ? outPath : "the output");
         return 3;
     }
-    std::fwrite(text.data(), 1, text.size(), out);
-    if (outPath) std::fclose(out);
     return 0;
 }
 

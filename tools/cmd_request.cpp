@@ -153,10 +153,8 @@ int Statement(int argc, char** argv) {
                      TagName(missingTag).c_str());
         return 1;
     }
-    FILE* out = opt.count("-o") ? std::fopen(opt["-o"].c_str(), "wb") : stdout;
-    if (!out) return Fail("cannot write the output file");
-    std::fwrite(text.data(), 1, text.size(), out);
-    if (out != stdout) std::fclose(out);
+    if (!WriteOutput(opt.count("-o") ? opt["-o"].c_str() : nullptr, text))
+        return Fail("cannot write the output");
     return 0;
 }
 

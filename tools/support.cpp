@@ -2,6 +2,10 @@
 
 #include <cstdio>
 #include <cstring>
+#ifdef _WIN32
+#include <fcntl.h>
+#include <io.h>
+#endif
 
 namespace {
 
@@ -139,4 +143,19 @@ int WriteDocument(Document& doc, bool xml, std::string& out) {
     file.SetOmitHeaders(0);
     out.assign(buffer.GetBufferPtr() ? buffer.GetBufferPtr() : "", buffer.GetBufferSize());
     return status;
+}
+
+bool WriteOutput(const char* path, const std::string& text) {
+    FILE* out = stdout;
+    if (path) {
+        out = std::fopen(path, "wb");
+        if (!out) return false;
+    } else {
+#ifdef _WIN32
+        _setmode(_fileno(stdout), _O_BINARY);
+#endif
+    }
+    bool ok = std::fwrite(text.data(), 1, text.size(), out) == text.size();
+    if (path) ok = std::fclose(out) == 0 && ok;
+    return ok;
 }

@@ -48,6 +48,10 @@ template <class F> void WalkTree(OEDataObj* object, int depth, F&& visit) {
 // bound are written whole. Returns the build status.
 int WriteDocument(Document& doc, bool xml, std::string& out);
 
+// Writes the text to a file, or to standard output (switched to binary on Windows, so that the
+// document's own line ends pass unchanged). False when the file cannot be written.
+bool WriteOutput(const char* path, const std::string& text);
+
 // The date-time as OFX text, or empty.
 std::string DateText(const OEDateTime* value);
 
