@@ -316,15 +316,21 @@ unsigned short OEAggregate::SetChildObj(OETagID tag, OEDataObj* child) {
     const OEFieldRow* row = FindRow(tag);
     if (!row || row->m_kind != OEFK_CHILD) return 0;
     OEDataObj** slot = static_cast<OEDataObj**>(Slot(row));
-    if (*slot != child) delete *slot;
-    *slot = nullptr;
     const OEAggregateDesc& d = Describe();
     const OEFieldRow* markRow = row;
+    for (unsigned short i = 0; child && i < d.m_fieldCount; ++i) {
+        const OEFieldRow* other = &d.m_fields[i];
+        if (other->m_kind == OEFK_CHILD && Slot(other) == slot && other->m_tag == child->GetType())
+            markRow = other;
+    }
+    // A child whose tag does not apply at this version is refused; the caller keeps it.
+    if (child && !IsValidTag(markRow->m_tag)) return 0;
+    if (*slot != child) delete *slot;
+    *slot = nullptr;
     for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
         const OEFieldRow* other = &d.m_fields[i];
-        if (other->m_kind != OEFK_CHILD || Slot(other) != slot) continue;
-        if (ValidateTag(other->m_tag)) ClearTag(other->m_tag);
-        if (child && other->m_tag == child->GetType()) markRow = other;
+        if (other->m_kind == OEFK_CHILD && Slot(other) == slot && ValidateTag(other->m_tag))
+            ClearTag(other->m_tag);
     }
     if (!child) return 1;
     *slot = child;
