@@ -121,3 +121,71 @@ TEST(File, RequestFileWritesOnAfterHeaderFailureResponseFileStops) {
 }
 
 } // namespace
+
+namespace {
+
+TEST(File, MultipartSubfilesGetTheirLengthAndType) {
+    std::unique_ptr<OEFile> outer(F()->NewFile(1));
+    outer->SetBoundary(OEString("XYZ"));
+    outer->SetMIMEBody(OEString("trailer"));
+    // A complete request: the part is built with the required check.
+    std::unique_ptr<OEFileRq> part(F()->NewFileRq(1));
+    part->AddDefaultOFXHeaders(1);
+    OERequest* rq = F()->NewRequest(1);
+    part->AppendRequest(rq);
+    OEMessageSetRq* signOnSet = F()->NewMessageSetRq(1);
+    signOnSet->SetType(OETAG_SIGNONMSGSRQV1);
+    rq->AppendMessageSet(signOnSet);
+    OESignOnRq* signOn = F()->NewSignOnRq(1);
+    signOn->SetDtClient(OEString("20240105"));
+    signOn->SetLanguage(OEString("ENG"));
+    signOn->SetAppId(OEString("QWIN"));
+    signOn->SetAppVer(static_cast<unsigned short>(2700));
+    signOn->SetUserKey(OEString("k"));
+    signOnSet->SetSignOnRq(signOn);
+    ASSERT_EQ(outer->AppendSubfile(part.get()), 1);
+    ASSERT_EQ(outer->GetNumberOfSubfiles(), 1);
+    EXPECT_NE(outer->GetSubfile(0), part.get()) << "the file keeps a copy";
+    int status = -1;
+    std::string text = Build(outer.get(), OEBCL_CRLF, &status);
+    EXPECT_EQ(status, OEBS_OK);
+    OEFile* stored = outer->GetSubfile(0);
+    OEString lengthName("content-length"), typeName("content-type");
+    ASSERT_NE(stored->GetMIMEHeader(&lengthName), nullptr);
+    ASSERT_NE(stored->GetMIMEHeader(&typeName), nullptr);
+    EXPECT_STREQ(stored->GetMIMEHeader(&typeName)->GetValue().c_str(), "application/x-ofx");
+    EXPECT_EQ(text.rfind("--XYZ\n", 0), 0u) << text;
+    EXPECT_NE(text.find("content-length: "), std::string::npos);
+    EXPECT_NE(text.find("trailer\n--XYZ--\n"), std::string::npos);
+}
+
+TEST(File, DisconnectHandsObjectsBack) {
+    std::unique_ptr<OEMessageSetRq> set(F()->NewMessageSetRq(1));
+    set->SetType(OETAG_BANKMSGSRQV1);
+    OETransRq* a = F()->NewTransRq(1);
+    a->SetType(OETAG_STMTTRNRQ);
+    OESyncRq* sync = F()->NewSyncRq(1);
+    sync->SetType(OETAG_INTRASYNCRQ);
+    EXPECT_EQ(set->SetSync(1, sync), 0) << "beyond the count";
+    EXPECT_EQ(set->SetSync(0, sync), 1) << "equal to the count appends";
+    EXPECT_EQ(set->AppendTrans(a), 1);
+    EXPECT_EQ(set->ValidateTag(OETAG_INTRASYNCRQ), 1);
+    std::unique_ptr<OETransRq> back(set->DisconnectTrans(0));
+    EXPECT_EQ(back.get(), a);
+    EXPECT_EQ(set->GetNumTrans(), 0);
+    EXPECT_EQ(set->ValidateTag(OETAG_STMTTRNRQ), 0);
+    std::unique_ptr<OESyncRq> syncBack(set->DisconnectSync(0));
+    EXPECT_EQ(syncBack.get(), sync);
+    EXPECT_EQ(set->DisconnectSync(0), nullptr);
+
+    std::unique_ptr<OETransRs> rs(F()->NewTransRs(1));
+    rs->SetType(OETAG_STMTTRNRS);
+    OEBankStatementRs* inner = F()->NewBankStatementRs(1);
+    EXPECT_EQ(rs->SetActualTrans(inner), 1);
+    EXPECT_EQ(rs->ValidateTag(OETAG_STMTRS), 1);
+    std::unique_ptr<OETransBase> innerBack(rs->DisconnectActualTrans());
+    EXPECT_EQ(innerBack.get(), inner);
+    EXPECT_EQ(rs->ValidateTag(OETAG_STMTRS), 0);
+}
+
+} // namespace
