@@ -170,9 +170,19 @@ OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, c
     return OEPS_OK;
 }
 
+unsigned short OEAggregate::RowApplies(unsigned short index) const {
+    const OEAggregateDesc& d = Describe();
+    const unsigned char* bits = d.Bits();
+    if (!bits || bits[index] == 0xFF) return IsValidTag(d.m_fields[index].m_tag);
+    if (d.m_valid[bits[index]].m_versionMask & GetMsgSetVersion()) return 1;
+    return IsValidTag(d.m_fields[index].m_tag); // a later row of the same tag may apply
+}
+
 unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
     const OEFieldRow* row = FindRow(tag);
-    if (!row || !IsValidTag(tag)) return 0;
+    if (!row) return 0;
+    unsigned short index = static_cast<unsigned short>(row - Describe().m_fields);
+    if (!RowApplies(index)) return 0;
     void* slot = Slot(row);
     const char* s = text.c_str();
     switch (row->m_kind) {
@@ -190,7 +200,7 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
     // is present converts through a copy, so that a refused text leaves the old value.
     case OEFK_AMOUNT: {
         OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
-        if (!ValidateTag(tag)) {
+        if (!RowPresent(index)) {
             if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
         } else {
             OEPrecisionInteger value;
@@ -202,7 +212,7 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
     }
     case OEFK_DATETIME: {
         OEDateTime* field = static_cast<OEDateTime*>(slot);
-        if (!ValidateTag(tag)) {
+        if (!RowPresent(index)) {
             if (!field->ConvertStringToOEDateTime(s)) break;
         } else {
             OEDateTime value;

@@ -172,6 +172,8 @@ protected:
     OEBuildStatus BuildPresentRow(OEBuilder* builder, const OEFieldRow* row);
     // 1 when field row `index` of this class is present (the same answer as ValidateTag).
     unsigned short RowPresent(unsigned short index) const;
+    // 1 when the tag of field row `index` applies at this object's version (as IsValidTag).
+    unsigned short RowApplies(unsigned short index) const;
     // Records this object as the failed one (if none is yet) and returns the status.
     OEBuildStatus Fail(OEBuilder* builder, OEBuildStatus status);
     // Creates a child for a start tag through the factory and pushes it (the protocol of
