@@ -58,7 +58,8 @@ step() {
   fi
   timings+=("$(printf '%6ds  %s' "$((SECONDS - start))" "$name")")
   if [ $rc -ne 0 ]; then
-    [ "$logfile" = - ] || cat "$logfile"
+    # Ninja's progress lines ("[12/80] Building ...") say nothing about the failure.
+    [ "$logfile" = - ] || grep -Ev '^\[[0-9]+/[0-9]+\] ' "$logfile"
     say "FAILED: $name (exit status $rc)"
     failed=$((failed + 1))
     results+=("FAILED: $name")
