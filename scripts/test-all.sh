@@ -189,6 +189,8 @@ leg_windows() {
   [ -d "$WINEPREFIX" ] && stop_wine
   rm -rf "$WINEPREFIX"
   trap stop_wine EXIT
+  getent hosts localhost >/dev/null ||
+    say "warning: 'localhost' does not resolve here (no /etc/hosts line?): HTTPS tests under wine will fail"
   fresh "$b"
   step "windows: wine prefix" - wine_prefix || return
   step "windows: configure (MinGW-w64 posix)" "$logs/windows-configure.log" \
