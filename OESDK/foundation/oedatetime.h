@@ -18,7 +18,7 @@ public:
     // name in 4 bytes (NUL padded) = 24 bytes.
     enum : unsigned short { kBinaryRecordSize = 24, kBinaryVersion = 1 };
     // GetTimeT of a year before 1902.
-    static const long long kOutOfRange = 2147483648LL;
+    static constexpr long long kOutOfRange = 2147483648LL;
 
     OEDateTimeBase();
     OEDateTimeBase(const OEDateTimeBase& other);
