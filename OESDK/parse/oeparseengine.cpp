@@ -161,9 +161,10 @@ void AssignRange(OEString& out, const char* p, std::size_t n) {
 OEParseEngine::OEParseEngine(OEBuffer* buffer)
     : m_dictionary(OETagDictionary::TheOETagDictionary()), m_buffer(buffer),
       m_data(buffer ? buffer->GetBufferPtr() : nullptr),
-      m_size(buffer && m_data ? buffer->GetBufferSize() : 0), m_haveLookAhead(false), m_pos(0),
-      m_headerPos(0), m_piPos(0), m_piEnd(0), m_headersDone(false), m_lastStartEmpty(false) {
-    m_lookAhead.m_kind = kRawEnd;
+      m_size(buffer && m_data ? buffer->GetBufferSize() : 0), m_tokenStart(0), m_haveLookAhead(false),
+      m_pos(0), m_headerPos(0), m_piPos(0), m_piEnd(0), m_headersDone(false), m_lastStartEmpty(false),
+      m_elementNameStart(0), m_elementNameLength(0), m_elementEntry(nullptr) {
+    m_lookAhead = RawToken{kRawEnd, 0, 0, 0, 0, -1, false};
     const void* lt = m_size ? std::memchr(m_data, '<', m_size) : nullptr;
     m_pos = lt ? static_cast<unsigned long>(static_cast<const char*>(lt) - m_data) : m_size;
     g_nameIndex = &TheNameIndex();
