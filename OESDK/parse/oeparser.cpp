@@ -182,6 +182,7 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
 
     if (status == OEPS_OK && log->GetAnyParseExceptionsLogged()) {
         status = OEPS_WARNINGS;
+        // The object of the first exception says more than the root, which is current again.
         if (!m_objectWithError) {
             OEParseException* first = log->GetParseException(0);
             m_objectWithError = (first && first->GetObject()) ? first->GetObject() : m_current;
