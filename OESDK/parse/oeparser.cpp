@@ -132,7 +132,10 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
 
     OEThreadState::SetErrorCode(OETE_NONE);
     OEParseLogger* log = OEParseLogger::TheOEParseLogger();
-    if (!log) return OEPS_NORESOURCE; // the thread never attached
+    if (!log) { // the thread never attached
+        root->SetupForParsing(nullptr);
+        return OEPS_NORESOURCE;
+    }
     log->DeleteAll();
     log->SetBuffer(buffer);
     log->SetParser(this);
@@ -143,6 +146,7 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
         engine = OEMemory::New<OEParseEngine>(buffer);
         if (!engine) {
             OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+            root->SetupForParsing(nullptr);
             log->SetBuffer(nullptr);
             log->SetParser(nullptr);
             return OEPS_NORESOURCE;
