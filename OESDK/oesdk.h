@@ -16,9 +16,30 @@
 #include "foundation/oebuffer.h"
 #include "foundation/oedynarr.h"
 #include "foundation/oethread.h"
+#include "foundation/oeprecision.h"
+#include "foundation/oedatetime.h"
+#include "foundation/oelanguage.h"
+#include "foundation/oeenums.h"
+#include "foundation/oedataconv.h"
+#include "foundation/oepayrollamount.h"
+#include "foundation/oepayrollenums.h"
+#include "foundation/oepayrolldataconv.h"
 
 // Tags and data objects
 #include "tags/oetagid.h"
 #include "tags/oetagdictionary.h"
+#include "tags/oeheadertag.h"
+#include "tags/oedataobj.h"
+#include "tags/oedatafactory.h"
+
+// Parsing
+#include "parse/oeparseexception.h"
+#include "parse/oeparselogger.h"
+#include "parse/oeutility.h"
+#include "parse/oeparseengine.h"
+#include "parse/oeparser.h"
+
+// OFX file envelope
+#include "file/oemimeheader.h"
 
 #endif
