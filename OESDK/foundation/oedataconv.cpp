@@ -11,12 +11,14 @@ void Warn(OEParseWarning code, const char* text) {
     OELogParseWarning(code, text ? text : "", "");
 }
 
+inline char Upper(char c) {
+    return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+}
+
 bool EqualsIgnoreCase(const char* a, const char* b) {
     for (;; ++a, ++b) {
-        char x = *a, y = *b;
-        if (x >= 'a' && x <= 'z') x = static_cast<char>(x - 'a' + 'A');
-        if (y >= 'a' && y <= 'z') y = static_cast<char>(y - 'a' + 'A');
-        if (x != y) return false;
+        const char x = Upper(*a);
+        if (x != Upper(*b)) return false;
         if (!x) return true;
     }
 }
@@ -60,8 +62,9 @@ unsigned short OEDataConversion::StringToEnum(const char* text, unsigned short& 
         return 0;
     }
     if (table) {
+        const char head = Upper(text[0]);
         for (unsigned i = first; i <= last; ++i) {
-            if (EqualsIgnoreCase(text, table[i])) {
+            if (Upper(table[i][0]) == head && EqualsIgnoreCase(text, table[i])) {
                 value = static_cast<unsigned short>(i);
                 return 1;
             }

@@ -181,10 +181,11 @@ unsigned short OEDateTimeBase::SetDay(unsigned short dayOfYear, unsigned short y
 }
 
 unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short fraction) {
-    return SetTimeZone(name, hours, fraction, name);
+    if (StoreTimeZone(name, hours, fraction)) Warn(OEPW_BADFORMAT, name, kCtxMismatch);
+    return 1;
 }
 
-unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short fraction, const char* whole) {
+bool OEDateTimeBase::StoreTimeZone(const char* name, short hours, short fraction) {
     m_tzName.Assign(name, static_cast<unsigned short>(name ? std::strlen(name) : 0));
     m_tzHours = hours;
     m_tzFraction = fraction;
@@ -192,13 +193,17 @@ unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short 
         static const char* const kStandard[5] = {"AST", "EST", "CST", "MST", "PST"};
         static const char* const kDaylight[5] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
         const int i = -hours - 4;
-        if (m_tzName != kStandard[i] && m_tzName != kDaylight[i]) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
+        return m_tzName != kStandard[i] && m_tzName != kDaylight[i];
     }
-    return 1;
+    return false;
 }
 
-unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* whole, bool& failed) {
-    failed = false;
+void OEDateTimeBase::LogPending(unsigned pending, const char* whole) {
+    if (pending & kZoneIrregular) Warn(OEPW_BADFORMAT, whole, kCtxZone);
+    if (pending & kZoneNameMismatch) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
+}
+
+unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* whole, unsigned& pending) {
     const char* p = zone + 1; // past '['
     short sign = 1;
     bool signSeen = false, pointSeen = false, closed = false, nameTooLong = false;
@@ -208,7 +213,6 @@ unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* who
     int nameLen = 0;
     auto fail = [&]() {
         Warn(OEPW_BADFORMAT, whole, kCtxZone);
-        failed = true;
         return static_cast<unsigned short>(0);
     };
     for (; *p; ++p) {
@@ -253,17 +257,22 @@ unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* who
         }
     }
     if (closed && *p) return fail(); // text after the closing bracket
-    // Irregular but readable: logged once, and the parse goes on with what was read.
-    if (!closed || nameTooLong || p == zone + 2) Warn(OEPW_BADFORMAT, whole, kCtxZone);
+    // Irregular but readable: noted once, and the parse goes on with what was read.
+    if (!closed || nameTooLong || p == zone + 2) pending |= kZoneIrregular;
     if (fracDigits == 1) frac *= 10; // one digit counts as tenths of an hour
-    return SetTimeZone(name, static_cast<short>(sign * hours), static_cast<short>(sign * frac), whole);
+    if (StoreTimeZone(name, static_cast<short>(sign * hours), static_cast<short>(sign * frac)))
+        pending |= kZoneNameMismatch;
+    return 1;
 }
 
 unsigned short OEDateTimeBase::ConvertStringToOETime(const char* text) {
-    return ParseTime(text, text);
+    unsigned pending = 0;
+    if (!ParseTime(text, text, pending)) return 0;
+    LogPending(pending, text);
+    return 1;
 }
 
-unsigned short OEDateTimeBase::ParseTime(const char* text, const char* whole) {
+unsigned short OEDateTimeBase::ParseTime(const char* text, const char* whole, unsigned& pending) {
     Invalidate();
     if (!text) {
         Warn(OEPW_NULLPOINTER, "", kCtxTime);
@@ -272,9 +281,7 @@ unsigned short OEDateTimeBase::ParseTime(const char* text, const char* whole) {
     const char* bracket = std::strchr(text, '[');
     std::size_t len;
     if (bracket) {
-        bool failed = false;
-        ExtractTimeZone(bracket, whole, failed);
-        if (failed) return 0;
+        if (!ExtractTimeZone(bracket, whole, pending)) return 0;
         len = static_cast<std::size_t>(bracket - text);
     } else {
         if (std::strpbrk(text, "-:")) {
@@ -316,7 +323,8 @@ unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
         Warn(OEPW_BADFORMAT, text, kCtxDateTime);
         return 0;
     }
-    if (!ParseTime(text + 8, text)) return 0;
+    unsigned pending = 0;
+    if (!ParseTime(text + 8, text, pending)) return 0;
     if (!ReadDigits(text, 4, m_year) || !ReadDigits(text + 4, 2, m_month) ||
         !ReadDigits(text + 6, 2, m_day)) {
         Warn(OEPW_BADFORMAT, text, kCtxDateTime);
@@ -326,6 +334,7 @@ unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
         Warn(OEPW_OUTOFRANGE, text, kCtxDateTime);
         return 0;
     }
+    LogPending(pending, text);
     return 1;
 }
 

@@ -18,7 +18,7 @@ public:
     // name in 4 bytes (NUL padded) = 24 bytes.
     enum : unsigned short { kBinaryRecordSize = 24, kBinaryVersion = 1 };
     // GetTimeT of a year before 1902.
-    static const long long kOutOfRange = 2147483648LL;
+    static constexpr long long kOutOfRange = 2147483648LL;
 
     OEDateTimeBase();
     OEDateTimeBase(const OEDateTimeBase& other);
@@ -101,10 +101,16 @@ public:
     void UnLockBuffer();
 
 protected:
+    // Irregularities of a zone that do not fail the parse; they are logged only once the whole
+    // conversion has succeeded, so a failed conversion logs exactly its one failure.
+    enum : unsigned { kZoneIrregular = 1, kZoneNameMismatch = 2 };
     // `whole` is the text reported in warnings (the whole input of a date-time parse).
-    unsigned short ParseTime(const char* text, const char* whole);
-    unsigned short ExtractTimeZone(const char* zone, const char* whole, bool& failed);
-    unsigned short SetTimeZone(const char* name, short hours, short fraction, const char* whole);
+    unsigned short ParseTime(const char* text, const char* whole, unsigned& pending);
+    // Returns 0 (warning logged) when the zone text is malformed.
+    unsigned short ExtractTimeZone(const char* zone, const char* whole, unsigned& pending);
+    // Stores the zone; true when a North American name does not belong to the offset.
+    bool StoreTimeZone(const char* name, short hours, short fraction);
+    static void LogPending(unsigned pending, const char* whole);
     void SetFromDays(long long days, long long secondsOfDay);
 
     unsigned short m_year;

@@ -161,9 +161,10 @@ void AssignRange(OEString& out, const char* p, std::size_t n) {
 OEParseEngine::OEParseEngine(OEBuffer* buffer)
     : m_dictionary(OETagDictionary::TheOETagDictionary()), m_buffer(buffer),
       m_data(buffer ? buffer->GetBufferPtr() : nullptr),
-      m_size(buffer && m_data ? buffer->GetBufferSize() : 0), m_haveLookAhead(false), m_pos(0),
-      m_headerPos(0), m_piPos(0), m_piEnd(0), m_headersDone(false), m_lastStartEmpty(false) {
-    m_lookAhead.m_kind = kRawEnd;
+      m_size(buffer && m_data ? buffer->GetBufferSize() : 0), m_tokenStart(0), m_haveLookAhead(false),
+      m_pos(0), m_headerPos(0), m_piPos(0), m_piEnd(0), m_headersDone(false), m_lastStartEmpty(false),
+      m_elementNameStart(0), m_elementNameLength(0), m_elementEntry(nullptr) {
+    m_lookAhead = RawToken{kRawEnd, 0, 0, 0, 0, -1, false};
     const void* lt = m_size ? std::memchr(m_data, '<', m_size) : nullptr;
     m_pos = lt ? static_cast<unsigned long>(static_cast<const char*>(lt) - m_data) : m_size;
     g_nameIndex = &TheNameIndex();
@@ -186,7 +187,13 @@ namespace {
 const OETagDictionaryEntry* ResolveSlow(const char* name, unsigned short length);
 } // namespace
 
-inline const OETagDictionaryEntry* OEParseEngine::Resolve(const RawToken& token) {
+#if defined(__GNUC__)
+#define OE_ALWAYS_INLINE inline __attribute__((always_inline))
+#else
+#define OE_ALWAYS_INLINE inline
+#endif
+
+OE_ALWAYS_INLINE const OETagDictionaryEntry* OEParseEngine::Resolve(const RawToken& token) {
     const char* name = m_data + token.m_start;
     const unsigned short length = static_cast<unsigned short>(token.m_length);
     if (const OETagDictionaryEntry* entry = g_nameIndex->Find(name, length, token.m_start + 8 <= m_size))
@@ -357,12 +364,6 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
 
 // The hot path of the scanner: whitespace, a text, or a plain "<NAME>" / "</NAME>" tag.
 // Everything else (comments, CDATA, odd or broken tags, short tails) goes to ScanRaw.
-#if defined(__GNUC__)
-#define OE_ALWAYS_INLINE inline __attribute__((always_inline))
-#else
-#define OE_ALWAYS_INLINE inline
-#endif
-
 OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
 #ifdef OESDK_SCAN_SSE2
     const char* base = m_data;
@@ -625,7 +626,7 @@ inline unsigned short OEParseEngine::ValueText::SetRaw(const char* text, unsigne
     return 1;
 }
 
-inline unsigned short OEParseEngine::ReadText(const RawToken& token) {
+OE_ALWAYS_INLINE unsigned short OEParseEngine::ReadText(const RawToken& token) {
     if (token.m_hasNul) {
         AssignRange(m_value, m_data + token.m_start, token.m_length);
     } else if (!m_value.SetRaw(m_data + token.m_start, token.m_length, token.m_start + 16 <= m_size)) {

@@ -119,13 +119,15 @@ private:
     bool m_headersDone;
     bool m_lastStartEmpty;
     ValueText m_value;
+    // The name of the last unknown element, whose end tag is dropped with it.
     OEString m_unknownElement;
     // The last element's name as written and its row: its XML-style end tag resolves to the
     // same row without a second lookup (and without logging a lower-case name twice).
     unsigned long m_elementNameStart;
     unsigned short m_elementNameLength;
-    const OETagDictionaryEntry*
-        m_elementEntry; // name of the last unknown element, whose end tag is dropped too
+    const OETagDictionaryEntry* m_elementEntry;
 };
+
+#undef OE_INTERNAL
 
 #endif

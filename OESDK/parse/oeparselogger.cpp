@@ -16,8 +16,8 @@ OEParseLogger::OEParseLogger()
 OEParseLogger::~OEParseLogger() {}
 
 OEParseLogger* OEParseLogger::TheOEParseLogger() {
-    // Every log a thread record holds is made by OEAttachThread, and is one of these.
-    return static_cast<OEParseLogger*>(OEThreadState::GetParseLog());
+    // OEAttachThread makes one of these for every thread; a log installed otherwise is not one.
+    return dynamic_cast<OEParseLogger*>(OEThreadState::GetParseLog());
 }
 
 unsigned short OEParseLogger::AppendParseException(OEParseWarning code, const OEString& text,

@@ -132,7 +132,10 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
 
     OEThreadState::SetErrorCode(OETE_NONE);
     OEParseLogger* log = OEParseLogger::TheOEParseLogger();
-    if (!log) return OEPS_NORESOURCE; // the thread never attached
+    if (!log) { // the thread never attached
+        root->SetupForParsing(nullptr);
+        return OEPS_NORESOURCE;
+    }
     log->DeleteAll();
     log->SetBuffer(buffer);
     log->SetParser(this);
@@ -143,6 +146,7 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
         engine = OEMemory::New<OEParseEngine>(buffer);
         if (!engine) {
             OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+            root->SetupForParsing(nullptr);
             log->SetBuffer(nullptr);
             log->SetParser(nullptr);
             return OEPS_NORESOURCE;
@@ -182,6 +186,7 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
 
     if (status == OEPS_OK && log->GetAnyParseExceptionsLogged()) {
         status = OEPS_WARNINGS;
+        // The object of the first exception says more than the root, which is current again.
         if (!m_objectWithError) {
             OEParseException* first = log->GetParseException(0);
             m_objectWithError = (first && first->GetObject()) ? first->GetObject() : m_current;

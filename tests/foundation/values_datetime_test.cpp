@@ -77,6 +77,8 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
                  {"20240131[-5:EST", 1, OEPW_BADFORMAT, kTZ, "20240131000000.000[-5:EST]"},
                  {"20240131[-5:ESTX]", 1, OEPW_BADFORMAT, kTZ, "20240131000000.000[-5:EST]"},
                  {"20240131[5.555]", 0, OEPW_BADFORMAT, kTZ, nullptr},
+                 {"20230229[-5:PST]", 0, OEPW_OUTOFRANGE, kDT, nullptr}, // only the failure is logged
+                 {"2024013112000[]", 0, OEPW_BADFORMAT, kTM, nullptr},
                  {"20240131[--5]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[5-]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[5.5.]", 0, OEPW_BADFORMAT, kTZ, nullptr},
@@ -114,6 +116,12 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
     EXPECT_EQ(0, t.ConvertStringToOETime(nullptr));
     EXPECT_TRUE(log.ExactlyOne(OEPW_NULLPOINTER, "", kTM));
 
+    OEDateTime zone;
+    EXPECT_EQ(1, zone.SetTimeZone("CDT", -6, 0)); // kept, but CDT is -5
+    EXPECT_TRUE(log.ExactlyOne(OEPW_BADFORMAT, "CDT", kMismatch));
+    EXPECT_STREQ("CDT", zone.GetTimeZone());
+    EXPECT_EQ(1, zone.SetTimeZone("MDT", -6, 0));
+    EXPECT_TRUE(log.None());
     OEDateTime n("20240131[-3.5]");
     EXPECT_EQ(-3, n.GetTimeZoneHours());
     EXPECT_EQ(-50, n.GetTimeZoneFraction());

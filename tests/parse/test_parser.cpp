@@ -247,3 +247,31 @@ TEST(Parser, UnattachedThreadGetsStatus3) {
     t.join();
     EXPECT_EQ(status, OEPS_NORESOURCE);
 }
+
+namespace {
+int g_allocations = 0, g_failAt = 0;
+int FailNth(std::size_t) {
+    return ++g_allocations == g_failAt ? 1 : 0;
+}
+} // namespace
+
+TEST(Parser, EveryAllocationFailureGivesStatus3) {
+    // Irregular input, so that the log allocates too.
+    const std::string text = std::string(kSgml) + "<XFOO>1";
+    OEBuffer buffer;
+    buffer.WriteLarge(text.data(), static_cast<unsigned long>(text.size()));
+    for (g_failAt = 1;; ++g_failAt) {
+        testagg::Agg root(OETAG_NONE, 1);
+        OESimpleParser parser;
+        g_allocations = 0;
+        OEMemory::FailureHook old = OEMemory::SetFailureHook(FailNth);
+        OEParseStatus status = parser.Parse(&buffer, &root, 1, 0);
+        OEMemory::SetFailureHook(old);
+        if (g_allocations < g_failAt) {
+            EXPECT_EQ(status, OEPS_WARNINGS); // every allocation succeeded
+            break;
+        }
+        EXPECT_EQ(status, OEPS_NORESOURCE) << "failing allocation " << g_failAt;
+    }
+    EXPECT_GT(g_failAt, 3);
+}
