@@ -7,6 +7,7 @@
 
 // Platform layer
 #include "platform/oeplatform.h"
+#include "platform/oehttpclient.h"
 
 // Foundation types
 #include "foundation/oememory.h"
@@ -20,5 +21,10 @@
 // Tags and data objects
 #include "tags/oetagid.h"
 #include "tags/oetagdictionary.h"
+
+// Transport
+#include "net/oenetacc.h"
+#include "net/vrnacc.h"
+#include "net/recvacc.h"
 
 #endif

@@ -1,0 +1,103 @@
+// The parts of the HTTP client interface and the certificate object that are the same on every OS.
+#include "platform/oehttpclient.h"
+
+#include "foundation/oememory.h"
+
+#include <cstring>
+
+OEHttpClient::~OEHttpClient() {}
+
+long OEHttpClient::ICSetTrustStoreFile(const char*) {
+    return 1;
+}
+
+namespace {
+OEHttpClient* g_hostClient = nullptr;
+} // namespace
+
+OEHttpClient* OEHttpClient::GetCurrent() {
+    return g_hostClient ? g_hostClient : GetDefault();
+}
+
+OEHttpClient* OEHttpClient::SetCurrent(OEHttpClient* client) {
+    OEHttpClient* old = g_hostClient;
+    g_hostClient = client;
+    return old;
+}
+
+OECertificate::OECertificate() : m_der(nullptr), m_derLength(0), m_id(0) {
+    m_sha1[0] = '\0';
+}
+
+OECertificate::~OECertificate() {
+    Reset();
+}
+
+void OECertificate::Reset() {
+    OEMemory::Free(m_der);
+    m_der = nullptr;
+    m_derLength = 0;
+    m_sha1[0] = '\0';
+}
+
+namespace {
+// Reads the outer tag and length of an encoding. Returns the total size the header announces
+// (header + contents), 0 for an indefinite length, or -1 when the header is malformed.
+long long OuterSize(const unsigned char* p, unsigned long n) {
+    if (n < 2 || p[0] != 0x30) return -1; // a certificate is a SEQUENCE
+    unsigned char first = p[1];
+    if (first < 0x80) return 2 + static_cast<long long>(first);
+    if (first == 0x80) return 0;
+    unsigned count = first & 0x7Fu;
+    if (count > 4 || n < 2u + count) return -1;
+    unsigned long long len = 0;
+    for (unsigned i = 0; i < count; ++i) len = (len << 8) | p[2 + i];
+    return static_cast<long long>(2 + count + len);
+}
+} // namespace
+
+unsigned short OECertificate::Parse(const unsigned char* bytes, unsigned long length, bool strictDER) {
+    Reset();
+    if (!bytes || length == 0) return 0;
+    long long announced = OuterSize(bytes, length);
+    if (announced < 0) return 0;
+    if (strictDER && announced != static_cast<long long>(length)) return 0;
+    if (!strictDER && announced > static_cast<long long>(length)) return 0;
+    if (!OEPlatform::DecodeCertificate(bytes, length, &m_der, &m_derLength, m_sha1)) {
+        m_der = nullptr;
+        m_derLength = 0;
+        m_sha1[0] = '\0';
+        return 0;
+    }
+    return 1;
+}
+
+unsigned short OECertificate::ParseDER(const unsigned char* bytes, unsigned long length) {
+    return Parse(bytes, length, true);
+}
+
+unsigned short OECertificate::ParseBER(const unsigned char* bytes, unsigned long length) {
+    return Parse(bytes, length, false);
+}
+
+unsigned short OECertificate::GetCertID(char* out, std::size_t size) const {
+    if (!out || size == 0) return 0;
+    out[0] = '\0';
+    if (!m_der || size < sizeof m_sha1) return 0;
+    std::memcpy(out, m_sha1, sizeof m_sha1);
+    return 1;
+}
+
+std::size_t OECertificate::NormalizeID(const char* in, std::size_t length, char* out, std::size_t size) {
+    std::size_t n = 0;
+    if (!out || size == 0) return 0;
+    for (std::size_t i = 0; in && i < length && in[i]; ++i) {
+        char c = in[i];
+        if (c == ':' || c == ' ') continue;
+        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 'a' + 'A');
+        if (n + 1 >= size) break;
+        out[n++] = c;
+    }
+    out[n] = '\0';
+    return n;
+}
