@@ -4,6 +4,7 @@
 #include "foundation/oememory.h"
 
 #include <cstring>
+#include <string>
 
 OEHttpClient::~OEHttpClient() {}
 
@@ -56,6 +57,75 @@ long long OuterSize(const unsigned char* p, unsigned long n) {
 }
 } // namespace
 
+// Re-encodes one BER element with definite, minimal lengths (the DER rules for lengths), so
+// that a certificate given in BER gets the id of its DER form. Other BER liberties are kept.
+class BerToDer {
+public:
+    BerToDer(const unsigned char* p, std::size_t n) : m_p(p), m_n(n) {}
+    // Converts the element at `at`; `at` moves past it. False on malformed input.
+    bool Element(std::size_t& at, std::string& out, int depth) {
+        if (depth > 64 || at >= m_n) return false;
+        std::size_t tagStart = at;
+        unsigned char first = m_p[at++];
+        if ((first & 0x1F) == 0x1F) { // long tag number
+            do {
+                if (at >= m_n) return false;
+            } while (m_p[at++] & 0x80);
+        }
+        std::string tag(reinterpret_cast<const char*>(m_p + tagStart), at - tagStart);
+        if (at >= m_n) return false;
+        unsigned char l = m_p[at++];
+        std::string content;
+        if (l == 0x80) { // indefinite: constructed contents up to the end-of-contents marker
+            if (!(first & 0x20)) return false;
+            for (;;) {
+                if (at + 2 > m_n) return false;
+                if (m_p[at] == 0 && m_p[at + 1] == 0) {
+                    at += 2;
+                    break;
+                }
+                if (!Element(at, content, depth + 1)) return false;
+            }
+        } else {
+            std::size_t len = 0;
+            if (l < 0x80) {
+                len = l;
+            } else {
+                unsigned count = l & 0x7Fu;
+                if (count > 4 || at + count > m_n) return false;
+                for (unsigned i = 0; i < count; ++i) len = (len << 8) | m_p[at++];
+            }
+            if (len > m_n - at) return false;
+            if (first & 0x20) {
+                std::size_t end = at + len;
+                BerToDer inner(m_p, end);
+                while (at < end)
+                    if (!inner.Element(at, content, depth + 1)) return false;
+            } else {
+                content.assign(reinterpret_cast<const char*>(m_p + at), len);
+                at += len;
+            }
+        }
+        out += tag;
+        std::size_t len = content.size();
+        if (len < 0x80) {
+            out += static_cast<char>(len);
+        } else {
+            char bytes[8];
+            int count = 0;
+            for (std::size_t v = len; v; v >>= 8) bytes[count++] = static_cast<char>(v & 0xFF);
+            out += static_cast<char>(0x80 | count);
+            while (count) out += bytes[--count];
+        }
+        out += content;
+        return true;
+    }
+
+private:
+    const unsigned char* m_p;
+    std::size_t m_n;
+};
+
 unsigned short OECertificate::Parse(const unsigned char* bytes, unsigned long length, bool strictDER) {
     Reset();
     if (!bytes || length == 0) return 0;
@@ -63,6 +133,13 @@ unsigned short OECertificate::Parse(const unsigned char* bytes, unsigned long le
     if (announced < 0) return 0;
     if (strictDER && announced != static_cast<long long>(length)) return 0;
     if (!strictDER && announced > static_cast<long long>(length)) return 0;
+    std::string der;
+    if (!strictDER) {
+        std::size_t at = 0;
+        if (!BerToDer(bytes, length).Element(at, der, 0) || at != length) return 0;
+        bytes = reinterpret_cast<const unsigned char*>(der.data());
+        length = static_cast<unsigned long>(der.size());
+    }
     if (!OEPlatform::DecodeCertificate(bytes, length, &m_der, &m_derLength, m_sha1)) {
         m_der = nullptr;
         m_derLength = 0;
