@@ -14,7 +14,9 @@ void DefaultMessageFunctor(int severity, int subSeverity, const char* source, in
 
 Ops::Ops() : m_functor(&DefaultMessageFunctor) {}
 
-MessageFunctor Ops::GetMessageFunctor() const { return m_functor; }
+MessageFunctor Ops::GetMessageFunctor() const {
+    return m_functor;
+}
 
 MessageFunctor Ops::SetMessageFunctor(MessageFunctor functor) {
     MessageFunctor old = m_functor;

@@ -30,7 +30,9 @@ void Sleep(unsigned long milliseconds) {
     }
 }
 
-int PumpMessages() { return g_pumpHook ? (g_pumpHook(g_pumpContext) ? 1 : 0) : 0; }
+int PumpMessages() {
+    return g_pumpHook ? (g_pumpHook(g_pumpContext) ? 1 : 0) : 0;
+}
 
 PumpHook SetPumpHook(PumpHook hook, void* context) {
     PumpHook old = g_pumpHook;
@@ -67,7 +69,9 @@ std::FILE* _LDfopen(const char* name, const char* mode) {
     return std::fopen(name, mode);
 }
 
-int _LDunlink(const char* name) { return name ? unlink(name) : -1; }
+int _LDunlink(const char* name) {
+    return name ? unlink(name) : -1;
+}
 
 int _LD_stat(const char* name, OEFileStat* out) {
     struct stat st;

@@ -24,9 +24,13 @@ std::wstring Widen(const char* utf8) {
 }
 } // namespace
 
-unsigned long CurrentThreadId() { return static_cast<unsigned long>(GetCurrentThreadId()); }
+unsigned long CurrentThreadId() {
+    return static_cast<unsigned long>(GetCurrentThreadId());
+}
 
-void Sleep(unsigned long milliseconds) { ::Sleep(static_cast<DWORD>(milliseconds)); }
+void Sleep(unsigned long milliseconds) {
+    ::Sleep(static_cast<DWORD>(milliseconds));
+}
 
 int PumpMessages() {
     int quit = 0;
@@ -80,7 +84,9 @@ std::FILE* _LDfopen(const char* name, const char* mode) {
     return _wfopen(OEPlatform::Widen(name).c_str(), OEPlatform::Widen(mode).c_str());
 }
 
-int _LDunlink(const char* name) { return name ? _wunlink(OEPlatform::Widen(name).c_str()) : -1; }
+int _LDunlink(const char* name) {
+    return name ? _wunlink(OEPlatform::Widen(name).c_str()) : -1;
+}
 
 int _LD_stat(const char* name, OEFileStat* out) {
     struct _stat64 st;

@@ -5,8 +5,9 @@ POST or GET /ofx              the reply file (POST needs Content-Type applicatio
 POST or GET /status/NNN       an empty answer with HTTP status NNN
 POST or GET /slow/MS          the reply file after MS milliseconds (at most 10000)
 POST /echo                    the request body back
-Every request that reaches a handler (so: after the TLS handshake and the client's checks)
-appends "METHOD PATH BYTES" to the request log. The server binds 127.0.0.1 only and stops by
+Every request that reaches a handler appends "METHOD PATH BYTES" to the request log; a POST
+whose body never came in full (a client that refused the server after sending the headers)
+is logged as "HEADERS-ONLY PATH BYTES". The server binds 127.0.0.1 only and stops by
 itself after --max-requests requests or --lifetime seconds.
 """
 import argparse
@@ -46,13 +47,17 @@ def main():
             if self.command != "HEAD":
                 self.wfile.write(body)
 
-        def handle_any(self, body):
+        def handle_any(self, body, complete=True):
             with lock:
                 with open(a.request_log, "a") as log:
-                    log.write(f"{self.command} {self.path} {len(body)}\n")
+                    method = self.command if complete else "HEADERS-ONLY"
+                    log.write(f"{method} {self.path} {len(body)}\n")
                 state["n"] += 1
                 if state["n"] >= a.max_requests:
                     threading.Thread(target=self.server.shutdown, daemon=True).start()
+            if not complete:
+                self.close_connection = True
+                return
             path = self.path.split("?")[0]
             ctype = self.headers.get("Content-Type", "").split(";")[0].strip().lower()
             if path == "/ofx":
@@ -70,7 +75,11 @@ def main():
 
         def do_POST(self):
             n = int(self.headers.get("Content-Length", "0"))
-            self.handle_any(self.rfile.read(n) if n > 0 else b"")
+            try:
+                body = self.rfile.read(n) if n > 0 else b""
+            except (OSError, ssl.SSLError):
+                body = b""
+            self.handle_any(body, len(body) == n)
 
         def do_GET(self):
             self.handle_any(b"")
