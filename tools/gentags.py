@@ -59,7 +59,7 @@ def main():
     for i, name in enumerate(names, 1):
         table.append('    {%s, "%s"},' % (enumerator(i, name), name))
     table += ["};", "} // namespace", "",
-              "const OETagDictionaryEntry* GetOETagDictionary() { return kOETagTable; }", "",
+              "const OETagDictionaryEntry* GetOETagDictionary() {", "    return kOETagTable;", "}", "",
               "unsigned short NumberOfOEDictionaryEntry() {",
               "    return static_cast<unsigned short>(sizeof kOETagTable / sizeof kOETagTable[0]);", "}", ""]
     with open(os.path.join(TAGS, "oetagtable.cpp"), "w", encoding="ascii", newline="\n") as f:

@@ -19,14 +19,18 @@ OEBuffer::OEBuffer(unsigned long initial, unsigned long growBy)
     m_growBy = static_cast<std::uint32_t>(growBy);
 }
 
-OEBuffer::~OEBuffer() { OEMemory::Free(m_data); }
+OEBuffer::~OEBuffer() {
+    OEMemory::Free(m_data);
+}
 
 char OEBuffer::GetCh(long pos) {
     if (pos < 0 || static_cast<unsigned long>(pos) >= m_dataSize || !m_data) return 0;
     return m_data[pos];
 }
 
-unsigned long OEBuffer::GetMaxBufferSize() { return kMaxBufferSize; }
+unsigned long OEBuffer::GetMaxBufferSize() {
+    return kMaxBufferSize;
+}
 
 unsigned long OEBuffer::GrowBuffer(unsigned long need) {
     if (need == 0 && m_growBy == 0) return 0;
@@ -78,7 +82,9 @@ int OEBuffer::Write(const char* data, unsigned short length) {
     return OEBR_SUCCESS;
 }
 
-int OEBuffer::Write(char c) { return Write(&c, 1); }
+int OEBuffer::Write(char c) {
+    return Write(&c, 1);
+}
 
 int OEBuffer::Write(OEBuffer* other) {
     if (!other || !other->m_data) return OEBR_NOBUFFER;
@@ -131,8 +137,8 @@ unsigned short OEBuffer::FindSubChar(unsigned long from, char ch, unsigned long&
     size_t span = m_dataSize - from;
     // Stop at the first ch or 0 byte, whichever comes first.
     const char* hit = static_cast<const char*>(std::memchr(start, ch, span));
-    const char* zero = ch ? static_cast<const char*>(std::memchr(start, 0, hit ? size_t(hit - start) : span))
-                          : nullptr;
+    const char* zero =
+        ch ? static_cast<const char*>(std::memchr(start, 0, hit ? size_t(hit - start) : span)) : nullptr;
     if (zero) {
         pos = static_cast<unsigned long>(zero - m_data);
         return 0;

@@ -11,9 +11,9 @@ class OEString;
 
 enum OEBufferResult {
     OEBR_SUCCESS = 0,
-    OEBR_BEYONDEND = -9996,   // read past the data, write reaching the maximum, or no growth allowed
-    OEBR_GROWFAILED = -9997,  // growth failed (increment non-zero), or AllocateTo failed
-    OEBR_NOBUFFER = -9998     // no data block
+    OEBR_BEYONDEND = -9996,  // read past the data, write reaching the maximum, or no growth allowed
+    OEBR_GROWFAILED = -9997, // growth failed (increment non-zero), or AllocateTo failed
+    OEBR_NOBUFFER = -9998    // no data block
 };
 
 class OE_API OEBuffer {

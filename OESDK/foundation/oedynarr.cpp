@@ -10,9 +10,13 @@ OEDynamicArray::OEDynamicArray(unsigned short initial, unsigned short growBy)
     : m_capacity(0), m_count(0), m_initial(initial ? initial : 1), m_growBy(growBy ? growBy : 1),
       m_block(nullptr) {}
 
-OEDynamicArray::~OEDynamicArray() { OEMemory::Free(m_block); }
+OEDynamicArray::~OEDynamicArray() {
+    OEMemory::Free(m_block);
+}
 
-unsigned short OEDynamicArray::OkToAlloc(unsigned short) const { return 1; }
+unsigned short OEDynamicArray::OkToAlloc(unsigned short) const {
+    return 1;
+}
 
 int OEDynamicArray::Build(OEBuilder*, OETagID) {
     Util::GetOps().Message(1, 0, "oedynarr", __LINE__, "OEDynamicArray::Build",
@@ -56,12 +60,14 @@ unsigned short OEDynamicArray::InsertAt(unsigned short index, void* element) {
     return 1;
 }
 
-OEString* OEDynamicArrayString::MakeString(const char* text) { return OEMemory::New<OEString>(text); }
+OEString* OEDynamicArrayString::MakeString(const char* text) {
+    return OEMemory::New<OEString>(text);
+}
 
 unsigned short OEDynamicArrayString::AddString(const char* text) {
     OEString* s = MakeString(text);
     if (!s) return 0;
-    if (text && *text && s->IsNull()) {  // the text itself could not be stored
+    if (text && *text && s->IsNull()) { // the text itself could not be stored
         delete s;
         return 0;
     }

@@ -86,7 +86,8 @@ public:
 // A growable array of owned strings.
 class OE_API OEDynamicArrayString : public OEPtrArray<OEString> {
 public:
-    OEDynamicArrayString(unsigned short initial = 5, unsigned short growBy = 5) : OEPtrArray(initial, growBy) {}
+    OEDynamicArrayString(unsigned short initial = 5, unsigned short growBy = 5)
+        : OEPtrArray(initial, growBy) {}
     // Appends a copy of the text. Returns 1, or 0 when memory is short.
     virtual unsigned short AddString(const char* text);
     unsigned short AddString(const OEString& text);

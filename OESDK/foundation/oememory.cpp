@@ -12,14 +12,18 @@ namespace {
 std::atomic<FailureHook> g_failureHook{nullptr};
 }
 
-FailureHook SetFailureHook(FailureHook hook) { return g_failureHook.exchange(hook); }
+FailureHook SetFailureHook(FailureHook hook) {
+    return g_failureHook.exchange(hook);
+}
 
 int ShouldFail(std::size_t bytes) {
     FailureHook hook = g_failureHook.load(std::memory_order_relaxed);
     return hook ? hook(bytes) : 0;
 }
 
-void ReportFailure() { OEThreadState::SetErrorCode(OETE_OUTOFMEMORY); }
+void ReportFailure() {
+    OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+}
 
 void* Malloc(std::size_t bytes) {
     void* p = ShouldFail(bytes) ? nullptr : std::malloc(bytes ? bytes : 1);
@@ -39,6 +43,8 @@ void* Realloc(void* block, std::size_t bytes) {
     return p;
 }
 
-void Free(void* block) { std::free(block); }
+void Free(void* block) {
+    std::free(block);
+}
 
 } // namespace OEMemory

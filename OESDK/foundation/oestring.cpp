@@ -20,9 +20,13 @@ unsigned short ClampedLength(const char* text) {
 OEString::OEString()
     : m_specLength(kUnlimited), m_buffer(nullptr), m_bufferSize(0), m_length(0), m_encoding(OESE_PLAIN) {}
 
-OEString::OEString(const char* text) : OEString() { CopyString(text); }
+OEString::OEString(const char* text) : OEString() {
+    CopyString(text);
+}
 
-OEString::OEString(const char* text, unsigned short length) : OEString() { Assign(text, length); }
+OEString::OEString(const char* text, unsigned short length) : OEString() {
+    Assign(text, length);
+}
 
 OEString::OEString(const OEString& other) : OEString() {
     if (other.m_length) Assign(other.m_buffer, other.m_length);
@@ -38,7 +42,9 @@ OEString::OEString(OEString&& other) noexcept
     other.m_length = 0;
 }
 
-OEString::~OEString() { FreeBuffer(); }
+OEString::~OEString() {
+    FreeBuffer();
+}
 
 void OEString::FreeBuffer() {
     OEMemory::Free(m_buffer);
@@ -155,11 +161,17 @@ OEString& OEString::operator+=(char c) {
     return *this;
 }
 
-unsigned short OEString::SetMsgSetVersion(unsigned short) { return 1; }
+unsigned short OEString::SetMsgSetVersion(unsigned short) {
+    return 1;
+}
 
-unsigned short OEString::IsValid() const { return m_length <= m_specLength ? 1 : 0; }
+unsigned short OEString::IsValid() const {
+    return m_length <= m_specLength ? 1 : 0;
+}
 
-void OEString::SetSpecLength(unsigned short specLength) { m_specLength = specLength; }
+void OEString::SetSpecLength(unsigned short specLength) {
+    m_specLength = specLength;
+}
 
 void OEString::Truncate(unsigned short n) {
     if (!m_buffer || n > m_bufferSize) return;
@@ -169,7 +181,9 @@ void OEString::Truncate(unsigned short n) {
     }
 }
 
-void OEString::TruncateToSpec() { Truncate(m_specLength); }
+void OEString::TruncateToSpec() {
+    Truncate(m_specLength);
+}
 
 bool OEString::operator==(const OEString& other) const {
     if (m_length != other.m_length) return false;

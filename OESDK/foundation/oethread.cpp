@@ -35,7 +35,9 @@ OEParseWarningLog::~OEParseWarningLog() {}
 OEThreadRecord::OEThreadRecord(unsigned long threadId)
     : m_threadId(threadId), m_errorCode(OETE_NONE), m_parseLog(nullptr) {}
 
-OEThreadRecord::~OEThreadRecord() { delete m_parseLog; }
+OEThreadRecord::~OEThreadRecord() {
+    delete m_parseLog;
+}
 
 unsigned short OEAttachThread(unsigned long threadId) {
     std::lock_guard<std::recursive_mutex> lock(ListMutex());
@@ -72,7 +74,9 @@ OEThreadRecord* Find(unsigned long threadId) {
     return FindLocked(threadId);
 }
 
-OEThreadRecord* Current() { return Find(OEPlatform::CurrentThreadId()); }
+OEThreadRecord* Current() {
+    return Find(OEPlatform::CurrentThreadId());
+}
 
 unsigned long GetErrorCode() {
     OEThreadRecord* r = Current();

@@ -27,8 +27,8 @@ public:
     OEThreadRecord& operator=(const OEThreadRecord&) = delete;
 
     unsigned long m_threadId;
-    unsigned long m_errorCode;        // OEThreadError; allocation failures set 1
-    OEParseWarningLog* m_parseLog;    // owned
+    unsigned long m_errorCode;     // OEThreadError; allocation failures set 1
+    OEParseWarningLog* m_parseLog; // owned
 };
 
 namespace OEThreadState {

@@ -43,8 +43,8 @@ OE_API int LocalTime64(OETime64 t, std::tm* out);
 
 // File wrappers of the host's utility library. Names are UTF-8 (converted to UTF-16 on Windows).
 struct OEFileStat {
-    long long size;          // bytes
-    long long modifiedTime;  // seconds since 1970-01-01 UTC
+    long long size;         // bytes
+    long long modifiedTime; // seconds since 1970-01-01 UTC
     unsigned int isDirectory;
 };
 OE_API std::FILE* _LDfopen(const char* name, const char* mode);

@@ -32,6 +32,12 @@ inline int CompareNames(const char* a, unsigned short lengthA, const char* b, un
     return CompareBytes(a, b, lengthA, caseType);
 }
 
+inline unsigned int HashName(const char* name, unsigned short length) {
+    unsigned int h = 2166136261u;
+    for (unsigned short i = 0; i < length; ++i) h = (h ^ static_cast<unsigned char>(name[i])) * 16777619u;
+    return h ^ length;
+}
+
 std::mutex& SingletonMutex() {
     static std::mutex m;
     return m;
@@ -79,19 +85,20 @@ int TagDictionary::sCompareTagID(const void* a, const void* b) {
 
 TagDictionary::TagDictionary(const OETagDictionaryEntry* table, unsigned short count)
     : m_table(table), m_nameIndex(nullptr), m_count(count), m_idIndex(nullptr), m_lowestId(OETAG_NONE),
-      m_mode(kContiguous) {
+      m_mode(kContiguous), m_hash(nullptr), m_hashMask(0), m_upperCaseNames(false) {
     m_compareType = OECaseSensitive;
     if (!table) {
         m_count = 0;
         return;
     }
     m_nameIndex = static_cast<OECompareInfo*>(OEMemory::Malloc(sizeof(OECompareInfo) * (count ? count : 1)));
-    if (!m_nameIndex) return;  // error code 1 already recorded; the dictionary is unusable
+    if (!m_nameIndex) return; // error code 1 already recorded; the dictionary is unusable
     for (unsigned short i = 0; i < count; ++i) {
         m_nameIndex[i].m_entry = &table[i];
         m_nameIndex[i].m_length = static_cast<unsigned short>(std::strlen(table[i].m_name));
     }
     std::qsort(m_nameIndex, count, sizeof(OECompareInfo), &TagDictionary::sCompareTag);
+    BuildHash();
 
     m_idIndex = static_cast<OEIdIndexInfo*>(OEMemory::Malloc(sizeof(OEIdIndexInfo) * (count ? count : 1)));
     if (!m_idIndex) {
@@ -114,6 +121,38 @@ TagDictionary::TagDictionary(const OETagDictionaryEntry* table, unsigned short c
 TagDictionary::~TagDictionary() {
     OEMemory::Free(m_nameIndex);
     OEMemory::Free(m_idIndex);
+    OEMemory::Free(m_hash);
+}
+
+void TagDictionary::BuildHash() {
+    m_upperCaseNames = true;
+    for (unsigned short i = 0; i < m_count && m_upperCaseNames; ++i)
+        for (const char* p = m_table[i].m_name; *p; ++p)
+            if (std::islower(static_cast<unsigned char>(*p))) {
+                m_upperCaseNames = false;
+                break;
+            }
+    unsigned int size = 16;
+    while (size < 2u * m_count) size <<= 1;
+    // The hash is an accelerator: failing to allocate it is not an error of the dictionary.
+    m_hash = static_cast<unsigned short*>(std::calloc(size, sizeof(unsigned short)));
+    if (!m_hash) return;
+    m_hashMask = size - 1;
+    for (unsigned short i = 0; i < m_count; ++i) {
+        unsigned int slot = HashName(m_nameIndex[i].m_entry->m_name, m_nameIndex[i].m_length) & m_hashMask;
+        while (m_hash[slot]) slot = (slot + 1) & m_hashMask;
+        m_hash[slot] = static_cast<unsigned short>(i + 1);
+    }
+}
+
+const OETagDictionaryEntry* TagDictionary::ProbeHash(const char* name, unsigned short length) const {
+    unsigned int slot = HashName(name, length) & m_hashMask;
+    while (unsigned short position = m_hash[slot]) {
+        const OECompareInfo& e = m_nameIndex[position - 1];
+        if (e.m_length == length && std::memcmp(e.m_entry->m_name, name, length) == 0) return e.m_entry;
+        slot = (slot + 1) & m_hashMask;
+    }
+    return nullptr;
 }
 
 unsigned short TagDictionary::AreTagIDsContiguous() const {
@@ -125,6 +164,17 @@ unsigned short TagDictionary::AreTagIDsContiguous() const {
 const OETagDictionaryEntry* TagDictionary::FindDictionaryEntry(const char* name, unsigned short length,
                                                                OECaseType caseType) const {
     if (!m_nameIndex || !name) return nullptr;
+    if (m_hash && m_count < 32768) {
+        if (caseType == OECaseSensitive) return ProbeHash(name, length);
+        if (m_upperCaseNames && length <= 64) {
+            // Every name is upper case, so folding the key finds the same row the folded
+            // comparison would.
+            char folded[64];
+            for (unsigned short i = 0; i < length; ++i)
+                folded[i] = static_cast<char>(std::toupper(static_cast<unsigned char>(name[i])));
+            return ProbeHash(folded, length);
+        }
+    }
     SearchDictionaryEntry search(m_nameIndex, m_count, name, length, caseType);
     unsigned short position = search.Search();
     return position == OEBinarySearch::kNotFound ? nullptr : m_nameIndex[position].m_entry;

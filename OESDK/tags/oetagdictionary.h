@@ -16,7 +16,7 @@
 // One row of a tag table.
 struct OETagDictionaryEntry {
     OETagID m_id;
-    const char* m_name;  // upper case, no angle brackets; "" for a reserved row
+    const char* m_name; // upper case, no angle brackets; "" for a reserved row
 };
 
 // One record of the name index: the row and the length of its name.
@@ -110,12 +110,22 @@ private:
                                                     OECaseType caseType) const;
     unsigned short AreTagIDsContiguous() const;
 
+    // Hash probe over the name index (exact bytes); key must already be in the table's case.
+    const OETagDictionaryEntry* ProbeHash(const char* name, unsigned short length) const;
+    void BuildHash();
+
     const OETagDictionaryEntry* m_table;
     OECompareInfo* m_nameIndex;
     unsigned short m_count;
     OEIdIndexInfo* m_idIndex;
     OETagID m_lowestId;
     LookupMode m_mode;
+    // Name lookups first try an open-addressing hash over the name index (positions + 1, 0 =
+    // empty slot); they give the same rows as the binary search, only sooner. Without it (memory
+    // short, or a table with mixed-case names) lookups use the binary search alone.
+    unsigned short* m_hash;
+    unsigned int m_hashMask;
+    bool m_upperCaseNames;
 };
 
 // The dictionary of the built-in OFX table, kept as a process-wide singleton.

@@ -1454,7 +1454,9 @@ const OETagDictionaryEntry kOETagTable[] = {
 };
 } // namespace
 
-const OETagDictionaryEntry* GetOETagDictionary() { return kOETagTable; }
+const OETagDictionaryEntry* GetOETagDictionary() {
+    return kOETagTable;
+}
 
 unsigned short NumberOfOEDictionaryEntry() {
     return static_cast<unsigned short>(sizeof kOETagTable / sizeof kOETagTable[0]);

@@ -1,0 +1,161 @@
+#include "oesdk.h"
+
+#include <gtest/gtest.h>
+
+#include <cctype>
+#include <cstring>
+#include <set>
+#include <string>
+
+TEST(TagTable, CountIdsAndNames) {
+    const OETagDictionaryEntry* table = GetOETagDictionary();
+    const unsigned short count = NumberOfOEDictionaryEntry();
+    ASSERT_EQ(count, 1448);
+    std::set<unsigned> ids;
+    std::set<std::string> names;
+    int empty = 0, kest = 0, payroll = 0;
+    size_t longest = 0;
+    for (unsigned short i = 0; i < count; ++i) {
+        ids.insert(table[i].m_id);
+        std::string name = table[i].m_name;
+        if (name.empty()) {
+            ++empty;
+            EXPECT_GE(table[i].m_id, 1221u);
+            EXPECT_LE(table[i].m_id, 1235u);
+            continue;
+        }
+        EXPECT_TRUE(names.insert(name).second) << "repeated name " << name;
+        for (char c : name)
+            EXPECT_TRUE(std::isupper(static_cast<unsigned char>(c)) || std::isdigit(c) || c == '.') << name;
+        kest += name.rfind("KEST.", 0) == 0;
+        payroll += name.rfind("K.", 0) == 0;
+        longest = std::max(longest, name.size());
+    }
+    EXPECT_EQ(empty, 15);
+    EXPECT_EQ(kest, 196);
+    EXPECT_EQ(payroll, 490);
+    EXPECT_EQ(longest, 37u);
+    ASSERT_EQ(ids.size(), 1448u);
+    EXPECT_EQ(*ids.begin(), 1u);
+    EXPECT_EQ(*ids.rbegin(), 1448u);
+}
+
+TEST(TagDictionary, KnownRowsBothWays) {
+    struct Row {
+        unsigned id;
+        const char* name;
+    };
+    const Row rows[] = {{1, "MIME"},         {69, "OFX"},
+                        {100, "SIGNONINFO"}, {140, "KEST.BROKERID"},
+                        {669, "STMTTRNRS"},  {1079, "K.PAYROLLRQ"},
+                        {1240, "WARNING"},   {1332, "K.WITHHELDINCOMETAXPRIORQTRADJUSTMENT"},
+                        {1439, "KEST.BID"},  {1448, "CLIENTUIDREQ"}};
+    OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+    ASSERT_NE(d, nullptr);
+    EXPECT_EQ(d->GetLookupMode(), TagDictionary::kContiguous);
+    EXPECT_EQ(d->GetLowestID(), 1u);
+    for (const Row& r : rows) {
+        EXPECT_STREQ(d->GetTagString(static_cast<OETagID>(r.id)), r.name);
+        OETagID id = OETAG_NONE;
+        const OETagDictionaryEntry* e =
+            d->GetTagID(r.name, static_cast<unsigned short>(std::strlen(r.name)), &id, OECaseSensitive);
+        ASSERT_NE(e, nullptr) << r.name;
+        EXPECT_EQ(static_cast<unsigned>(id), r.id);
+        EXPECT_EQ(d->FindDictionaryEntry(static_cast<OETagID>(r.id)), e);
+    }
+    for (unsigned id = 1221; id <= 1235; ++id) EXPECT_STREQ(d->GetTagString(static_cast<OETagID>(id)), "");
+    OETagID id = OETAG_OFX;
+    EXPECT_NE(d->GetTagID("", 0, &id, OECaseSensitive), nullptr); // one of the reserved rows
+    EXPECT_GE(id, 1221u);
+    EXPECT_LE(id, 1235u);
+}
+
+TEST(TagDictionary, CaseRulesAndSlices) {
+    OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+    ASSERT_NE(d, nullptr);
+    OETagID id = OETAG_OFX;
+    EXPECT_EQ(d->GetTagID("stmttrnrs", 9, &id, OECaseSensitive), nullptr);
+    EXPECT_EQ(id, OETAG_NONE);
+    const OETagDictionaryEntry* upper = d->GetTagID("STMTTRNRS", 9, &id, OECaseSensitive);
+    EXPECT_EQ(d->GetTagID("StmtTrnRs", 9, &id, OECaseInsensitive), upper);
+    EXPECT_EQ(id, OETAG_STMTTRNRS);
+    EXPECT_EQ(d->GetTagID("k.payrollrq", 11, &id, OECaseInsensitive)->m_id, OETAG_K_PAYROLLRQ);
+    EXPECT_EQ(d->GetTagID("STMTTRNRSX", 9, &id, OECaseSensitive), upper); // a slice of a longer text
+    EXPECT_EQ(d->GetTagID("STMTTRNRSX", 10, &id, OECaseSensitive), nullptr);
+    EXPECT_EQ(d->GetTagID("NOSUCHTAG", 9, &id, OECaseInsensitive), nullptr);
+    EXPECT_EQ(id, OETAG_NONE);
+}
+
+TEST(TagDictionary, CustomTablesChooseTheirLookupMode) {
+    static const OETagDictionaryEntry gap[] = {{static_cast<OETagID>(5), "FIVE"},
+                                               {static_cast<OETagID>(6), "SIX"},
+                                               {static_cast<OETagID>(8), "EIGHT"}};
+    static const OETagDictionaryEntry dense[] = {
+        {static_cast<OETagID>(12), "C"}, {static_cast<OETagID>(10), "A"}, {static_cast<OETagID>(11), "BB"}};
+    TagDictionary g(gap, 3);
+    EXPECT_EQ(g.GetLookupMode(), TagDictionary::kBinarySearch);
+    EXPECT_STREQ(g.GetTagString(static_cast<OETagID>(8)), "EIGHT");
+    EXPECT_EQ(g.GetTagString(static_cast<OETagID>(7)), nullptr);
+    TagDictionary d(dense, 3);
+    EXPECT_EQ(d.GetLookupMode(), TagDictionary::kContiguous);
+    EXPECT_EQ(d.GetLowestID(), 10u);
+    EXPECT_STREQ(d.GetTagString(static_cast<OETagID>(10)), "A");
+    EXPECT_STREQ(d.GetTagString(static_cast<OETagID>(12)), "C");
+    OETagID id = OETAG_NONE;
+    EXPECT_NE(d.GetTagID("BB", 2, &id, OECaseSensitive), nullptr);
+    EXPECT_EQ(id, 11u);
+    TagDictionary none(nullptr, 0);
+    EXPECT_EQ(none.GetTagID("A", 1, &id, OECaseSensitive), nullptr);
+}
+
+TEST(TagDictionary, NameOrderIsLengthFirst) {
+    OECompareInfo a{nullptr, 0}, b{nullptr, 0};
+    const OETagDictionaryEntry z{static_cast<OETagID>(1), "Z"}, aa{static_cast<OETagID>(2), "AA"};
+    a.m_entry = &z;
+    a.m_length = 1;
+    b.m_entry = &aa;
+    b.m_length = 2;
+    EXPECT_LT(TagDictionary::sCompare(a, b), 0);
+    EXPECT_GT(TagDictionary::sCompareTag(&b, &a), 0);
+    OEIdIndexInfo i1{0, static_cast<OETagID>(3)}, i2{1, static_cast<OETagID>(0x10002)}; // low 16 bits only
+    EXPECT_GT(TagDictionary::sCompareTagID(&i1, &i2), 0);
+}
+
+TEST(TagDictionary, DestroyAndRebuild) {
+    EXPECT_EQ(OETagDictionary::Destroy(nullptr), 0);
+    OETagDictionary* first = OETagDictionary::TheOETagDictionary();
+    ASSERT_NE(first, nullptr);
+    EXPECT_EQ(OETagDictionary::TheOETagDictionary(), first);
+    EXPECT_EQ(OETagDictionary::Destroy(first), 0);
+    EXPECT_EQ(OETagDictionary::ms_theOETagDictionary.load(), nullptr);
+    OETagDictionary* second = OETagDictionary::TheOETagDictionary();
+    ASSERT_NE(second, nullptr);
+    EXPECT_STREQ(second->GetTagString(OETAG_STMTTRNRS), "STMTTRNRS");
+}
+
+TEST(TagDictionary, EveryNameFindsItsOwnRowInBothCaseModes) {
+    OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+    ASSERT_NE(d, nullptr);
+    const OETagDictionaryEntry* table = GetOETagDictionary();
+    for (unsigned short i = 0; i < NumberOfOEDictionaryEntry(); ++i) {
+        std::string name = table[i].m_name;
+        if (name.empty()) continue;
+        std::string lower = name;
+        for (char& c : lower) c = static_cast<char>(std::tolower(static_cast<unsigned char>(c)));
+        unsigned short n = static_cast<unsigned short>(name.size());
+        OETagID id = OETAG_NONE;
+        EXPECT_EQ(d->GetTagID(name.c_str(), n, &id, OECaseSensitive), &table[i]) << name;
+        EXPECT_EQ(d->GetTagID(lower.c_str(), n, &id, OECaseInsensitive), &table[i]) << name;
+        EXPECT_EQ(id, table[i].m_id);
+    }
+}
+
+TEST(TagDictionary, MixedCaseCustomTableUsesTheFoldedSearch) {
+    static const OETagDictionaryEntry mixed[] = {{static_cast<OETagID>(1), "Abc"},
+                                                 {static_cast<OETagID>(2), "XY"}};
+    TagDictionary d(mixed, 2);
+    OETagID id = OETAG_NONE;
+    EXPECT_EQ(d.GetTagID("ABC", 3, &id, OECaseSensitive), nullptr);
+    EXPECT_EQ(d.GetTagID("ABC", 3, &id, OECaseInsensitive), &mixed[0]);
+    EXPECT_EQ(d.GetTagID("xy", 2, &id, OECaseInsensitive), &mixed[1]);
+}
