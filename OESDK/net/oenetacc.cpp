@@ -44,6 +44,50 @@ bool IsDrive(const char* p) {
 }
 } // namespace
 
+const char* OENetStatusName(OENetStatus status) {
+    switch (status) {
+    case OENetOK:
+        return "OENetOK";
+    case OENetOpenFailed:
+        return "OENetOpenFailed";
+    case OENetCannotConnect:
+        return "OENetCannotConnect";
+    case OENetNotHandled:
+        return "OENetNotHandled";
+    case OENetReplySizeFailed:
+        return "OENetReplySizeFailed";
+    case OENetReplyLoadFailed:
+        return "OENetReplyLoadFailed";
+    case OENetCloseFailed:
+        return "OENetCloseFailed";
+    case OENetRequestFailed:
+        return "OENetRequestFailed";
+    case OENetInitiateFailed:
+        return "OENetInitiateFailed";
+    case OENetOutOfMemory:
+        return "OENetOutOfMemory";
+    case OENetHttpClientError:
+        return "OENetHttpClientError";
+    case OENetServerUnavailable:
+        return "OENetServerUnavailable";
+    case OENetSSLSetupFailed:
+        return "OENetSSLSetupFailed";
+    case OENetSecurityError:
+        return "OENetSecurityError";
+    case OENetCancelFailed:
+        return "OENetCancelFailed";
+    case OENetNotAvailable:
+        return "OENetNotAvailable";
+    case OENetTimeout:
+        return "OENetTimeout";
+    case OENetNotImplemented:
+        return "OENetNotImplemented";
+    case OENetUnknownError:
+        return "OENetUnknownError";
+    }
+    return "OENetStatus";
+}
+
 // ---- OENetAccess ----------------------------------------------------------------------------
 
 OENetAccess::OENetAccess()

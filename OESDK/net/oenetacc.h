@@ -35,6 +35,9 @@ enum OENetStatus : unsigned int {
     OENetUnknownError = 29       // any other non-zero code, HTTP 500 included
 };
 
+// The name of a status ("OENetTimeout"); "OENetStatus" for a value without a name.
+OE_API const char* OENetStatusName(OENetStatus status);
+
 // What a transport reports through the session callback. The two pointers of each code:
 // OEOpProgress: unsigned long* done, unsigned long* total (0 = unknown) of the current transfer.
 enum OEOpCode : unsigned int { OEOpNone = 0, OEOpProgress = 1 };

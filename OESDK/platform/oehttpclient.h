@@ -119,7 +119,7 @@ public:
     virtual long ICCancel(ICSession session, ICRequest request) = 0;
 
     // Adds the PEM roots of a file to the client's own anchors for every later request (beside
-    // the system's roots). 0 on success.
+    // the system's roots); null removes them. 0 on success.
     virtual long ICSetTrustStoreFile(const char* pemFile);
 
     // The client the transport uses: the host's when one was installed, else the built-in one.

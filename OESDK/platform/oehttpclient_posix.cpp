@@ -452,9 +452,9 @@ public:
     }
 
     long ICSetTrustStoreFile(const char* pemFile) override {
-        if (!pemFile || access(pemFile, R_OK) != 0) return 2;
+        if (pemFile && access(pemFile, R_OK) != 0) return 2;
         std::lock_guard<std::mutex> guard(m_lock);
-        m_trustFile = pemFile;
+        m_trustFile = pemFile ? pemFile : "";
         return 0;
     }
 
