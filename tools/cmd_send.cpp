@@ -111,10 +111,10 @@ int OnPump(void*) {
         std::chrono::duration<double>(std::chrono::steady_clock::now() - g_progress.start).count();
     if (seconds > 1.0) {
         if (g_progress.total)
-            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu of %lu bytes ", seconds,
+            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu of %lu bytes transferred ", seconds,
                          g_progress.done, g_progress.total);
         else
-            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu bytes ", seconds, g_progress.done);
+            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu bytes transferred ", seconds, g_progress.done);
         std::fflush(stderr);
         g_progress.shown = true;
     }

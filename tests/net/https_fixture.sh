@@ -8,6 +8,7 @@ set -eu
 cmd=$1; d=$2; src=${3:-}
 case $cmd in
 start)
+  src=$(cd "$src" && pwd)
   if [ -f "$d/pid" ]; then kill "$(cat "$d/pid")" 2>/dev/null || true; fi
   rm -rf "$d"; mkdir -p "$d"; cd "$d"
   for ca in ca other; do
