@@ -17,6 +17,14 @@
 #include "foundation/oebuffer.h"
 #include "foundation/oedynarr.h"
 #include "foundation/oethread.h"
+#include "foundation/oeprecision.h"
+#include "foundation/oedatetime.h"
+#include "foundation/oelanguage.h"
+#include "foundation/oeenums.h"
+#include "foundation/oedataconv.h"
+#include "foundation/oepayrollamount.h"
+#include "foundation/oepayrollenums.h"
+#include "foundation/oepayrolldataconv.h"
 
 // Tags and data objects
 #include "tags/oetagid.h"

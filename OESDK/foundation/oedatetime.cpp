@@ -1,0 +1,670 @@
+#include "foundation/oedatetime.h"
+
+#include "foundation/oememory.h"
+#include "foundation/oeparsewarning.h"
+#include "platform/oeplatform.h"
+
+#include <cstring>
+
+namespace {
+
+const char kCtxDateTime[] = "ConvertStringToOEDateTime";
+const char kCtxTime[] = "ConvertStringToOETime";
+const char kCtxZone[] = "ExtractTimeZone";
+// The closing parenthesis is absent from this context text, as it always has been.
+const char kCtxMismatch[] = "SetTimeZone (time zone mismatch";
+
+const char kEmptyMarker[] = "^@~*";
+const char kEmptyMarkerLong[] = "__OFX_EMPTY_STRING__";
+
+const long long kSecondsPerDay = 86400;
+const long long kFourYears = 126230400; // 1461 days
+// The runtime's 64-bit conversions stop at the end of the year 3000; assignment from seconds
+// refuses what they would refuse, and years before 1.
+const long long kMaxSeconds = 32535215999LL;
+const long long kMinSeconds = -62135596800LL; // 0001-01-01T00:00:00
+
+const unsigned short kDaysPerMonth[12] = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+
+// Days from 1970-01-01 of a proleptic Gregorian date (any field values; no undefined behaviour).
+long long DaysFromCivil(long long y, long long m, long long d) {
+    y -= m <= 2;
+    const long long era = (y >= 0 ? y : y - 399) / 400;
+    const long long yoe = y - era * 400;
+    const long long doy = (153 * (m > 2 ? m - 3 : m + 9) + 2) / 5 + d - 1;
+    const long long doe = yoe * 365 + yoe / 4 - yoe / 100 + doy;
+    return era * 146097 + doe - 719468;
+}
+
+void CivilFromDays(long long z, long long& y, unsigned& m, unsigned& d) {
+    z += 719468;
+    const long long era = (z >= 0 ? z : z - 146096) / 146097;
+    const long long doe = z - era * 146097;
+    const long long yoe = (doe - doe / 1460 + doe / 36524 - doe / 146096) / 365;
+    y = yoe + era * 400;
+    const long long doy = doe - (365 * yoe + yoe / 4 - yoe / 100);
+    const long long mp = (5 * doy + 2) / 153;
+    d = static_cast<unsigned>(doy - (153 * mp + 2) / 5 + 1);
+    m = static_cast<unsigned>(mp < 10 ? mp + 3 : mp - 9);
+    y += m <= 2;
+}
+
+long long FloorDiv(long long a, long long b) {
+    return a / b - ((a % b != 0) && ((a < 0) != (b < 0)));
+}
+
+inline bool IsDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+
+// Reads n decimal digits; false at a non-digit.
+bool ReadDigits(const char* p, int n, unsigned short& out) {
+    unsigned v = 0;
+    for (int i = 0; i < n; ++i) {
+        if (!IsDigit(p[i])) return false;
+        v = v * 10 + static_cast<unsigned>(p[i] - '0');
+    }
+    out = static_cast<unsigned short>(v);
+    return true;
+}
+
+char* Put2(char* p, unsigned v) {
+    p[0] = static_cast<char>('0' + v / 10 % 10);
+    p[1] = static_cast<char>('0' + v % 10);
+    return p + 2;
+}
+
+// Unsigned decimal with at least `width` digits.
+char* PutUnsigned(char* p, unsigned v, int width) {
+    char tmp[12];
+    int n = 0;
+    do {
+        tmp[n++] = static_cast<char>('0' + v % 10);
+        v /= 10;
+    } while (v);
+    while (n < width) tmp[n++] = '0';
+    while (n) *p++ = tmp[--n];
+    return p;
+}
+
+char* PutSigned(char* p, int v) {
+    if (v < 0) {
+        *p++ = '-';
+        return PutUnsigned(p, 0u - static_cast<unsigned>(v), 1);
+    }
+    return PutUnsigned(p, static_cast<unsigned>(v), 1);
+}
+
+char* PutName(char* p, const OEString3& name) {
+    for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
+    return p;
+}
+
+void Warn(OEParseWarning code, const char* value, const char* context) {
+    OELogParseWarning(code, value ? value : "", context);
+}
+
+} // namespace
+
+OEDateTimeBase::OEDateTimeBase()
+    : m_year(0), m_month(0), m_day(0), m_hour(0), m_minute(0), m_second(0), m_millisecond(0), m_tzHours(0),
+      m_tzFraction(0), m_binary(nullptr) {}
+
+OEDateTimeBase::OEDateTimeBase(const OEDateTimeBase& other)
+    : m_year(other.m_year), m_month(other.m_month), m_day(other.m_day), m_hour(other.m_hour),
+      m_minute(other.m_minute), m_second(other.m_second), m_millisecond(other.m_millisecond),
+      m_tzHours(other.m_tzHours), m_tzFraction(other.m_tzFraction), m_tzName(other.m_tzName),
+      m_binary(nullptr) {}
+
+OEDateTimeBase::~OEDateTimeBase() {
+    OEMemory::Free(m_binary);
+}
+
+OEDateTimeBase& OEDateTimeBase::operator=(const OEDateTimeBase& other) {
+    if (this == &other) return *this;
+    m_year = other.m_year;
+    m_month = other.m_month;
+    m_day = other.m_day;
+    m_hour = other.m_hour;
+    m_minute = other.m_minute;
+    m_second = other.m_second;
+    m_millisecond = other.m_millisecond;
+    m_tzHours = other.m_tzHours;
+    m_tzFraction = other.m_tzFraction;
+    m_tzName = other.m_tzName;
+    return *this;
+}
+
+OEDateTimeBase& OEDateTimeBase::operator=(const char* text) {
+    ConvertStringToOEDateTime(text);
+    return *this;
+}
+
+void OEDateTimeBase::Invalidate() {
+    m_year = m_month = m_day = m_hour = m_minute = m_second = m_millisecond = 0;
+    m_tzHours = m_tzFraction = 0;
+    m_tzName.Truncate(0); // keeps the buffer for the next name
+}
+
+unsigned short OEDateTimeBase::IsLeapYear(unsigned short year) {
+    return (year % 4 == 0 && (year % 100 != 0 || year % 400 == 0)) ? 1 : 0;
+}
+
+unsigned short OEDateTimeBase::DaysInMonth(unsigned short month, unsigned short year) {
+    if (month < 1 || month > 12) return 0;
+    return static_cast<unsigned short>(kDaysPerMonth[month - 1] + (month == 2 && IsLeapYear(year) ? 1 : 0));
+}
+
+unsigned short OEDateTimeBase::IsValidDate() const {
+    return m_month >= 1 && m_month <= 12 && m_day >= 1 && m_day <= DaysInMonth(m_month, m_year) ? 1 : 0;
+}
+
+unsigned short OEDateTimeBase::IsValidTime() const {
+    // No lower bound on the fraction: negative offsets such as -3.5 hours carry a negative one.
+    return m_hour <= 23 && m_minute <= 59 && m_second <= 59 && m_millisecond <= 999 && m_tzHours >= -12 &&
+                   m_tzHours <= 12 && m_tzFraction <= 99
+               ? 1
+               : 0;
+}
+
+unsigned short OEDateTimeBase::SetDay(unsigned short dayOfYear, unsigned short year) {
+    const unsigned short daysInYear = IsLeapYear(year) ? 366 : 365;
+    if (dayOfYear == 0 || dayOfYear > daysInYear) return 0;
+    unsigned short month = 1;
+    unsigned short left = dayOfYear;
+    while (left > DaysInMonth(month, year))
+        left = static_cast<unsigned short>(left - DaysInMonth(month++, year));
+    m_year = year;
+    m_month = month;
+    m_day = left;
+    return 1;
+}
+
+unsigned short OEDateTimeBase::SetTimeZone(const char* name, short hours, short fraction) {
+    if (StoreTimeZone(name, hours, fraction)) Warn(OEPW_BADFORMAT, name, kCtxMismatch);
+    return 1;
+}
+
+bool OEDateTimeBase::StoreTimeZone(const char* name, short hours, short fraction) {
+    m_tzName.Assign(name, static_cast<unsigned short>(name ? std::strlen(name) : 0));
+    m_tzHours = hours;
+    m_tzFraction = fraction;
+    if (hours <= -4 && hours >= -8 && fraction == 0 && !m_tzName.IsEmpty()) {
+        static const char* const kStandard[5] = {"AST", "EST", "CST", "MST", "PST"};
+        static const char* const kDaylight[5] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
+        const int i = -hours - 4;
+        return m_tzName != kStandard[i] && m_tzName != kDaylight[i];
+    }
+    return false;
+}
+
+void OEDateTimeBase::LogPending(unsigned pending, const char* whole) {
+    if (pending & kZoneIrregular) Warn(OEPW_BADFORMAT, whole, kCtxZone);
+    if (pending & kZoneNameMismatch) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
+}
+
+unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* whole, unsigned& pending) {
+    const char* p = zone + 1; // past '['
+    short sign = 1;
+    bool signSeen = false, pointSeen = false, closed = false, nameTooLong = false;
+    int hourDigits = 0, fracDigits = 0;
+    int hours = 0, frac = 0;
+    char name[4] = {0, 0, 0, 0};
+    int nameLen = 0;
+    auto fail = [&]() {
+        Warn(OEPW_BADFORMAT, whole, kCtxZone);
+        return static_cast<unsigned short>(0);
+    };
+    for (; *p; ++p) {
+        const char c = *p;
+        if (c == ']') {
+            closed = true;
+            ++p;
+            break;
+        }
+        if (c == ':') {
+            if (p == zone + 1) return fail();
+            for (++p; *p && *p != ']'; ++p) {
+                if (nameLen < 3)
+                    name[nameLen++] = *p;
+                else
+                    nameTooLong = true;
+            }
+            if (*p == ']') {
+                closed = true;
+                ++p;
+            }
+            break;
+        }
+        if (c == '+' || c == '-') {
+            if (signSeen || hourDigits > 0 || pointSeen) return fail();
+            signSeen = true;
+            sign = c == '-' ? -1 : 1;
+        } else if (IsDigit(c)) {
+            if (pointSeen) {
+                if (fracDigits == 2) return fail();
+                frac = frac * 10 + (c - '0');
+                ++fracDigits;
+            } else {
+                if (hours < 1000) hours = hours * 10 + (c - '0'); // far out of range stays out of range
+                ++hourDigits;
+            }
+        } else if (c == '.') {
+            if (pointSeen) return fail();
+            pointSeen = true;
+        } else {
+            return fail();
+        }
+    }
+    if (closed && *p) return fail(); // text after the closing bracket
+    // Irregular but readable: noted once, and the parse goes on with what was read.
+    if (!closed || nameTooLong || p == zone + 2) pending |= kZoneIrregular;
+    if (fracDigits == 1) frac *= 10; // one digit counts as tenths of an hour
+    if (StoreTimeZone(name, static_cast<short>(sign * hours), static_cast<short>(sign * frac)))
+        pending |= kZoneNameMismatch;
+    return 1;
+}
+
+unsigned short OEDateTimeBase::ConvertStringToOETime(const char* text) {
+    unsigned pending = 0;
+    if (!ParseTime(text, text, pending)) return 0;
+    LogPending(pending, text);
+    return 1;
+}
+
+unsigned short OEDateTimeBase::ParseTime(const char* text, const char* whole, unsigned& pending) {
+    Invalidate();
+    if (!text) {
+        Warn(OEPW_NULLPOINTER, "", kCtxTime);
+        return 0;
+    }
+    const char* bracket = std::strchr(text, '[');
+    std::size_t len;
+    if (bracket) {
+        if (!ExtractTimeZone(bracket, whole, pending)) return 0;
+        len = static_cast<std::size_t>(bracket - text);
+    } else {
+        if (std::strpbrk(text, "-:")) {
+            Warn(OEPW_BADFORMAT, whole, kCtxTime);
+            return 0;
+        }
+        len = std::strlen(text);
+    }
+    bool ok = true;
+    if (len > 6) {
+        // HHMMSS.X to HHMMSS.XXX; the digits after the point are the milliseconds.
+        const std::size_t msDigits = len - 7;
+        ok = text[6] == '.' && msDigits >= 1 && msDigits <= 3 &&
+             ReadDigits(text + 7, static_cast<int>(msDigits), m_millisecond);
+    } else {
+        ok = len % 2 == 0;
+    }
+    if (ok && len >= 6) ok = ReadDigits(text + 4, 2, m_second);
+    if (ok && len >= 4) ok = ReadDigits(text + 2, 2, m_minute);
+    if (ok && len >= 2) ok = ReadDigits(text, 2, m_hour);
+    if (!ok) {
+        Warn(OEPW_BADFORMAT, whole, kCtxTime);
+        return 0;
+    }
+    if (!IsValidTime()) {
+        Warn(OEPW_OUTOFRANGE, whole, kCtxTime);
+        return 0;
+    }
+    return 1;
+}
+
+unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
+    Invalidate();
+    if (!text) {
+        Warn(OEPW_NULLPOINTER, "", kCtxDateTime);
+        return 0;
+    }
+    if (std::strlen(text) < 8) {
+        Warn(OEPW_BADFORMAT, text, kCtxDateTime);
+        return 0;
+    }
+    unsigned pending = 0;
+    if (!ParseTime(text + 8, text, pending)) return 0;
+    if (!ReadDigits(text, 4, m_year) || !ReadDigits(text + 4, 2, m_month) ||
+        !ReadDigits(text + 6, 2, m_day)) {
+        Warn(OEPW_BADFORMAT, text, kCtxDateTime);
+        return 0;
+    }
+    if (!IsValidDate()) {
+        Warn(OEPW_OUTOFRANGE, text, kCtxDateTime);
+        return 0;
+    }
+    LogPending(pending, text);
+    return 1;
+}
+
+unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
+    if (!IsValidDate() || !IsValidTime()) return 0;
+    char buf[48];
+    char* p = PutUnsigned(buf, m_year, 4);
+    p = Put2(p, m_month);
+    p = Put2(p, m_day);
+    if (m_hour || m_minute || m_second || m_millisecond || m_tzHours || m_tzFraction) {
+        p = Put2(p, m_hour);
+        p = Put2(p, m_minute);
+        p = Put2(p, m_second);
+        if (m_millisecond || m_tzHours || m_tzFraction) {
+            *p++ = '.';
+            p = PutUnsigned(p, m_millisecond, 3);
+        }
+        if (m_tzHours || m_tzFraction) {
+            *p++ = '[';
+            if (m_tzHours == 0 && m_tzFraction < 0) {
+                *p++ = '-';
+                *p++ = '0';
+            } else {
+                p = PutSigned(p, m_tzHours);
+            }
+            if (m_tzFraction) {
+                *p++ = '.';
+                p = PutUnsigned(p, static_cast<unsigned>(m_tzFraction < 0 ? -m_tzFraction : m_tzFraction), 2);
+            }
+            if (!m_tzName.IsEmpty()) {
+                *p++ = ':';
+                p = PutName(p, m_tzName);
+            }
+            *p++ = ']';
+        }
+    }
+    return out.Assign(buf, static_cast<unsigned short>(p - buf));
+}
+
+unsigned short OEDateTimeBase::GetTimeString(OEString& out) const {
+    if (!IsValidTime()) return 0;
+    char buf[40];
+    char* p = Put2(buf, m_hour);
+    p = Put2(p, m_minute);
+    p = Put2(p, m_second);
+    if (m_millisecond) {
+        *p++ = '.';
+        p = PutUnsigned(p, m_millisecond, 1); // not padded in the time form
+    }
+    if (m_tzHours) {
+        *p++ = '[';
+        p = PutSigned(p, m_tzHours);
+        if (m_tzFraction) {
+            *p++ = '.';
+            p = PutUnsigned(p, static_cast<unsigned>(m_tzFraction < 0 ? -m_tzFraction : m_tzFraction), 2);
+        }
+        if (!m_tzName.IsEmpty()) {
+            *p++ = ':';
+            p = PutName(p, m_tzName);
+        }
+        *p++ = ']';
+    } else if (!m_tzName.IsEmpty()) {
+        *p++ = ':';
+        p = PutName(p, m_tzName);
+    }
+    return out.Assign(buf, static_cast<unsigned short>(p - buf));
+}
+
+long long OEDateTimeBase::GetTimeT() const {
+    if (m_year < 1902) return kOutOfRange;
+    long long year = m_year;
+    long long blocks = 0;
+    if (year < 1970) {
+        // Moved forward by whole four-year blocks of 1461 days, taken off again at the end.
+        blocks = (1969 - year) / 4 + 1;
+        year += 4 * blocks;
+    }
+    long long t =
+        DaysFromCivil(year, m_month, m_day) * kSecondsPerDay + m_hour * 3600LL + m_minute * 60LL + m_second;
+    t -= blocks * kFourYears;
+    t -= (m_tzHours * 100LL + m_tzFraction) * 36;
+    return t;
+}
+
+long long OEDateTimeBase::LocalTimeZoneOffset() {
+    const OEPlatform::OETime64 now = OEPlatform::Time64(nullptr);
+    std::tm local{};
+    if (!OEPlatform::LocalTime64(now, &local)) return 0;
+    const long long asUtc =
+        DaysFromCivil(local.tm_year + 1900LL, local.tm_mon + 1LL, local.tm_mday) * kSecondsPerDay +
+        local.tm_hour * 3600LL + local.tm_min * 60LL + local.tm_sec;
+    return asUtc - now;
+}
+
+void OEDateTimeBase::SetFromDays(long long days, long long secondsOfDay) {
+    long long y;
+    unsigned m, d;
+    CivilFromDays(days, y, m, d);
+    m_year = static_cast<unsigned short>(y);
+    m_month = static_cast<unsigned short>(m);
+    m_day = static_cast<unsigned short>(d);
+    m_hour = static_cast<unsigned short>(secondsOfDay / 3600);
+    m_minute = static_cast<unsigned short>(secondsOfDay / 60 % 60);
+    m_second = static_cast<unsigned short>(secondsOfDay % 60);
+}
+
+unsigned short OEDateTimeBase::AssignSeconds(long long seconds) {
+    if (seconds < kMinSeconds || seconds > kMaxSeconds) return 0;
+    const long long days = FloorDiv(seconds, kSecondsPerDay);
+    SetFromDays(days, seconds - days * kSecondsPerDay);
+    m_millisecond = 0;
+    m_tzHours = 0;
+    m_tzFraction = 0;
+    return 1;
+}
+
+unsigned short OEDateTimeBase::FromPrecInt(const OEPrecisionInteger& seconds) {
+    if (!seconds.IsValid()) return 0;
+    OEPrecisionInteger ms(seconds);
+    ms.Decimal(3);
+    if (!ms.FitInASInt64()) return 0;
+    const long long total = ms.GetOEINT64();
+    const long long whole = FloorDiv(total, 1000);
+    if (!AssignSeconds(whole)) return 0;
+    m_millisecond = static_cast<unsigned short>(total - whole * 1000);
+    return 1;
+}
+
+unsigned short OEDateTimeBase::ConvertToGMT() {
+    if (!IsValidDate() || !IsValidTime() || m_year < 1902) return 0;
+    return AssignSeconds(GetTimeT());
+}
+
+unsigned short OEDateTimeBase::ConvertToLocalTime(short hours, short fraction) {
+    if (!IsValidDate() || !IsValidTime() || m_year < 1902) return 0;
+    if (!AssignSeconds(GetTimeT() + (hours * 100LL + fraction) * 36)) return 0;
+    m_tzHours = hours;
+    m_tzFraction = fraction;
+    return 1;
+}
+
+OEDateTimeBase& OEDateTimeBase::operator+=(long long seconds) {
+    // A date before 1902 has no count of seconds; it is left as it is.
+    if (m_year < 1902) return *this;
+    if (AssignSeconds(GetTimeT() + seconds)) m_tzName = "";
+    return *this;
+}
+
+OEDateTimeBase& OEDateTimeBase::operator+=(const OEPrecisionInteger& seconds) {
+    const OEPrecisionInteger whole = seconds.Integer();
+    if (whole.IsValid() && whole.FitInASInt64()) operator+=(whole.GetOEINT64());
+    return *this;
+}
+
+OEDateTimeBase& OEDateTimeBase::operator+=(const OEDateTimeBase& other) {
+    if (other.m_year >= 1902) operator+=(other.GetTimeT());
+    return *this;
+}
+
+// Milliseconds since 1970 in universal time, for every year.
+static long long InstantMs(unsigned short y, unsigned short mo, unsigned short d, unsigned short h,
+                           unsigned short mi, unsigned short s, unsigned short ms, short tzh, short tzf) {
+    return (DaysFromCivil(y, mo, d) * kSecondsPerDay + h * 3600LL + mi * 60LL + s -
+            (tzh * 100LL + tzf) * 36) *
+               1000 +
+           ms;
+}
+
+OEPrecisionInteger OEDateTimeBase::GetGMT() const {
+    return OEPrecisionInteger(
+        InstantMs(m_year, m_month, m_day, m_hour, m_minute, m_second, m_millisecond, m_tzHours, m_tzFraction),
+        3);
+}
+
+OEPrecisionInteger OEDateTimeBase::SecondsBetween(const OEDateTimeBase& other) const {
+    return other.GetGMT() - GetGMT();
+}
+
+int OEDateTimeBase::compareDateTime(const OEDateTimeBase& other) const {
+    const long long a =
+        InstantMs(m_year, m_month, m_day, m_hour, m_minute, m_second, m_millisecond, m_tzHours, m_tzFraction);
+    const long long b = InstantMs(other.m_year, other.m_month, other.m_day, other.m_hour, other.m_minute,
+                                  other.m_second, other.m_millisecond, other.m_tzHours, other.m_tzFraction);
+    return a == b ? 0 : (a > b ? 1 : -1);
+}
+
+static void Put16(unsigned char* p, unsigned v) {
+    p[0] = static_cast<unsigned char>(v);
+    p[1] = static_cast<unsigned char>(v >> 8);
+}
+static unsigned short Get16(const unsigned char* p) {
+    return static_cast<unsigned short>(p[0] | (static_cast<unsigned>(p[1]) << 8));
+}
+
+unsigned short OEDateTimeBase::ExportBinary(unsigned char* block, unsigned long* size) const {
+    if (!block) return 0;
+    const unsigned short fields[10] = {kBinaryVersion,
+                                       m_year,
+                                       m_month,
+                                       m_day,
+                                       m_hour,
+                                       m_minute,
+                                       m_second,
+                                       m_millisecond,
+                                       static_cast<unsigned short>(m_tzHours),
+                                       static_cast<unsigned short>(m_tzFraction)};
+    for (int i = 0; i < 10; ++i) Put16(block + 2 * i, fields[i]);
+    std::memset(block + 20, 0, 4);
+    std::memcpy(block + 20, m_tzName.c_str(), m_tzName.GetStrLength() < 3 ? m_tzName.GetStrLength() : 3);
+    if (size) *size = kBinaryRecordSize;
+    return 1;
+}
+
+unsigned short OEDateTimeBase::ImportBinary(const unsigned char* block) {
+    if (!block || Get16(block) != kBinaryVersion) return 0;
+    m_year = Get16(block + 2);
+    m_month = Get16(block + 4);
+    m_day = Get16(block + 6);
+    m_hour = Get16(block + 8);
+    m_minute = Get16(block + 10);
+    m_second = Get16(block + 12);
+    m_millisecond = Get16(block + 14);
+    m_tzHours = static_cast<short>(Get16(block + 16));
+    m_tzFraction = static_cast<short>(Get16(block + 18));
+    char name[4] = {0, 0, 0, 0};
+    std::memcpy(name, block + 20, 3);
+    m_tzName = name;
+    return 1;
+}
+
+unsigned char* OEDateTimeBase::LockBuffer() {
+    if (!m_binary) m_binary = static_cast<unsigned char*>(OEMemory::Calloc(kBinaryRecordSize));
+    return m_binary;
+}
+
+void OEDateTimeBase::UnLockBuffer() {
+    OEMemory::Free(m_binary);
+    m_binary = nullptr;
+}
+
+// --- OEDateTime, OETime -------------------------------------------------------------------
+
+OEDateTime::OEDateTime(short year, short month, short day, short hour, short minute, short second,
+                       short millisecond, short tzHours, short tzFraction) {
+    m_year = static_cast<unsigned short>(year);
+    m_month = static_cast<unsigned short>(month);
+    m_day = static_cast<unsigned short>(day);
+    m_hour = static_cast<unsigned short>(hour);
+    m_minute = static_cast<unsigned short>(minute);
+    m_second = static_cast<unsigned short>(second);
+    m_millisecond = static_cast<unsigned short>(millisecond);
+    m_tzHours = tzHours;
+    m_tzFraction = tzFraction;
+}
+
+OEDateTime::OEDateTime(const char* text) {
+    ConvertStringToOEDateTime(text);
+}
+
+OEDateTime::OEDateTime(const OEPrecisionInteger& seconds) {
+    FromPrecInt(seconds);
+}
+
+OEDateTime& OEDateTime::operator=(const char* text) {
+    ConvertStringToOEDateTime(text);
+    return *this;
+}
+
+// Kept as it has always been: the result is this date-time itself.
+OEDateTime OEDateTime::TimeBetween(const OEDateTimeBase&) const {
+    return *this;
+}
+
+OETime::OETime(short year, short month, short day, short hour, short minute, short second, short millisecond,
+               short tzHours, short tzFraction) {
+    m_year = static_cast<unsigned short>(year);
+    m_month = static_cast<unsigned short>(month);
+    m_day = static_cast<unsigned short>(day);
+    m_hour = static_cast<unsigned short>(hour);
+    m_minute = static_cast<unsigned short>(minute);
+    m_second = static_cast<unsigned short>(second);
+    m_millisecond = static_cast<unsigned short>(millisecond);
+    m_tzHours = tzHours;
+    m_tzFraction = tzFraction;
+}
+
+OETime::OETime(const char* text) {
+    ConvertStringToOETime(text);
+}
+
+OETime& OETime::operator=(const char* text) {
+    ConvertStringToOETime(text);
+    return *this;
+}
+
+OETime OETime::TimeBetween(const OEDateTimeBase&) const {
+    return *this;
+}
+
+// --- OEPayrollDateTime ----------------------------------------------------------------------
+
+OEPayrollDateTime::OEPayrollDateTime(const char* text) : m_empty(0) {
+    Assign(text);
+}
+
+OEPayrollDateTime::OEPayrollDateTime(short year, short month, short day, short hour, short minute,
+                                     short second, short millisecond)
+    : OEDateTime(year, month, day, hour, minute, second, millisecond, 0, 0), m_empty(0) {}
+
+OEPayrollDateTime& OEPayrollDateTime::operator=(const char* text) {
+    Assign(text);
+    return *this;
+}
+
+OEPayrollDateTime& OEPayrollDateTime::operator=(const OEPayrollDateTime& other) {
+    OEDateTime::operator=(other);
+    m_empty = other.m_empty;
+    return *this;
+}
+
+unsigned short OEPayrollDateTime::Assign(const char* text) {
+    if (text && (std::strcmp(text, kEmptyMarker) == 0 || std::strcmp(text, kEmptyMarkerLong) == 0)) {
+        m_empty = 1;
+        return 1;
+    }
+    m_empty = 0;
+    return ConvertStringToOEDateTime(text);
+}
+
+unsigned short OEPayrollDateTime::GetDateString(OEString& out) const {
+    if (m_empty) return out.Assign(kEmptyMarker, 4);
+    return OEDateTime::GetDateString(out);
+}
