@@ -332,6 +332,10 @@ unsigned long Transfer(Request* r, std::FILE* reply, std::FILE* headers) {
     unsigned long code = 0;
     if (r->cancelled.load()) code = kICNetworkErrorBase | kICErrOperationCancelled;
 
+    // Like the POSIX client: no redirects, so the request (and its credentials) goes to the
+    // server that was checked and nowhere else.
+    DWORD redirects = WINHTTP_OPTION_REDIRECT_POLICY_NEVER;
+    WinHttpSetOption(h, WINHTTP_OPTION_REDIRECT_POLICY, &redirects, sizeof redirects);
     int ms = r->timeout > 0 ? static_cast<int>(r->timeout * 1000) : 0;
     if (code == 0) WinHttpSetTimeouts(h, ms ? ms : 0, ms ? ms : 30000, ms ? ms : 120000, ms ? ms : 120000);
     if (code == 0 && https) {

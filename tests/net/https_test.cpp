@@ -188,6 +188,10 @@ TEST_F(HttpsTest, HttpStatusesMapToNetStatuses) {
         EXPECT_EQ(request->GetReplySize(&size), OENetReplySizeFailed);
     }
     EXPECT_EQ(request->Get(OEString((base + "/status/503").c_str())), OENetServerUnavailable);
+    // Redirects are not followed: the request goes to the checked server only.
+    EXPECT_EQ(request->Send(OEString((base + "/redirect").c_str()), &body), OENetUnknownError);
+    EXPECT_EQ(request->GetReceiveError(), kICHttpStatusBase | 307);
+    EXPECT_FALSE(ServerSaw("/ofx?case=redirected"));
 }
 
 TEST_F(HttpsTest, TimeoutAndAbort) {

@@ -5,6 +5,7 @@ POST or GET /ofx              the reply file (POST needs Content-Type applicatio
 POST or GET /status/NNN       an empty answer with HTTP status NNN
 POST or GET /slow/MS          the reply file after MS milliseconds (at most 10000)
 POST /echo                    the request body back
+POST or GET /redirect         307 to /ofx?case=redirected
 Every request that reaches a handler appends "METHOD PATH BYTES" to the request log; a POST
 whose body never came in full (a client that refused the server after sending the headers)
 is logged as "HEADERS-ONLY PATH BYTES". The server binds 127.0.0.1 only and stops by
@@ -38,8 +39,10 @@ def main():
         def log_message(self, fmt, *args):
             sys.stderr.write("server: " + fmt % args + "\n")
 
-        def answer(self, code, body):
+        def answer(self, code, body, location=None):
             self.send_response(code)
+            if location:
+                self.send_header("Location", location)
             self.send_header("Content-Type", "application/x-ofx")
             self.send_header("X-OESDK-Test", "loopback")
             self.send_header("Content-Length", str(len(body)))
@@ -64,6 +67,8 @@ def main():
                 if self.command == "POST" and ctype != "application/x-ofx":
                     return self.answer(415, b"")
                 return self.answer(200, reply)
+            if path == "/redirect":
+                return self.answer(307, b"", "/ofx?case=redirected")
             if path == "/echo":
                 return self.answer(200, body)
             if path.startswith("/status/"):
