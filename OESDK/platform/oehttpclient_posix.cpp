@@ -540,8 +540,12 @@ int TempDirForModule(void* moduleInstance, char* out, std::size_t size) {
     if (!stem.empty()) {
         std::string candidate = base + "/" + stem + "-tmp";
         if (mkdir(candidate.c_str(), 0700) == 0 || errno == EEXIST) {
+            // Replies land there: only a private folder of ours will do, not one someone else
+            // made (or linked) in the shared temporary directory.
             struct stat st;
-            if (stat(candidate.c_str(), &st) == 0 && S_ISDIR(st.st_mode)) dir = candidate;
+            if (lstat(candidate.c_str(), &st) == 0 && S_ISDIR(st.st_mode) && st.st_uid == geteuid() &&
+                (st.st_mode & 077) == 0)
+                dir = candidate;
         }
     }
     if (dir.size() + 1 > size) return 0;
