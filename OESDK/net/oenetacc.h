@@ -117,6 +117,7 @@ public:
     // A "file:" address is kept and answered from disk (0); anything else is left to a
     // subclass (3).
     virtual OENetStatus Get(const OEString& url);
+    // The base sends nowhere: for a "file:" address the reply is read from that file, as Get.
     virtual OENetStatus Send(const OEString& url, OEBuffer* body);
     virtual OENetStatus SendPlusHeaders(const OEString& url, OEBuffer* body, const char* headers);
     virtual OENetStatus SendPlusHeadersContent(const OEString& url, OEBuffer* body, const char* headers,

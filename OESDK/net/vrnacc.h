@@ -65,7 +65,10 @@ public:
     OENetStatus SendPlusHeaders(const OEString& url, OEBuffer* body, const char* headers) override;
     OENetStatus SendPlusHeadersContent(const OEString& url, OEBuffer* body, const char* headers,
                                        const char* contentType) override;
+    // A "file:" address is answered from disk; anything else is a GET through the client.
     OENetStatus Get(const OEString& url) override;
+    // The reply the client left in its file (which is then removed): 0, or 6 when there is
+    // none or its size is not the one reported.
     OENetStatus LoadReply(OEBuffer* buffer) override;
     OENetStatus GetReplySize(unsigned long* size) override;
     // A reply header by name (case-insensitive) from the saved headers. 1 when found.
@@ -79,8 +82,7 @@ public:
     unsigned short AddTrustedRoot(const unsigned char* der, unsigned short length, short rootId) override;
     unsigned short AddTrustedRootBER(const unsigned char* ber, unsigned short length, short rootId) override;
     // An expected certificate id: the id text of the server's certificate (40 hex digits, case
-    // and ':' separators ignored).
-    // Both return 1, or 0 when memory is short.
+    // and ':' separators ignored). Both return 1, or 0 when memory is short.
     unsigned short AddExpectedSSLCertID(const unsigned char* id, unsigned short length) override;
     unsigned short AddExpectedSSLCertName(const OEString& name) override;
     // 1 when a name was added that equals this one without regard to case.
@@ -96,11 +98,18 @@ public:
     // Log name of a root id's group.
     static const char* RootGroupName(short rootId);
 
-    // The client's callbacks; context is the request.
+    // The client's callbacks; their context is the request's ticket (see vrnacc.cpp), so a late
+    // callback after the request is gone is harmless.
     static void CompletionCallback(unsigned long status, const ICCallbackData* data, void* context);
     static long VRNSSLCertificateCallback(const ICCertificate* chain, unsigned long count, short rootId,
                                           long error, void* context, long reserved1, long reserved2);
+    // Progress (status 0) goes to the access's Progress; completion (status 1) takes the reply
+    // and header files, the reply size and the code, and ends the wait.
     void DoCallback(unsigned long status, const ICCallbackData* data);
+    // The certificate rules: a client error is returned as it is; root group 3000 gives 1671;
+    // with trusted roots added the root id must be one of theirs (else 1670); the last (the
+    // server's) certificate must parse (else 1670) and match an expected id if any were added
+    // (else 1673). 0 accepts.
     long CheckCertificate(const ICCertificate* chain, unsigned long count, short rootId, long error);
 
 protected:
