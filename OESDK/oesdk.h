@@ -29,6 +29,19 @@
 // Tags and data objects
 #include "tags/oetagid.h"
 #include "tags/oetagdictionary.h"
+#include "tags/oeheadertag.h"
+#include "tags/oedataobj.h"
+#include "tags/oedatafactory.h"
+
+// Parsing
+#include "parse/oeparseexception.h"
+#include "parse/oeparselogger.h"
+#include "parse/oeutility.h"
+#include "parse/oeparseengine.h"
+#include "parse/oeparser.h"
+
+// OFX file envelope
+#include "file/oemimeheader.h"
 
 // Transport
 #include "net/oenetacc.h"

@@ -152,7 +152,8 @@ enum OEFrequency {
     OEFREQ_ANNUALLY = 8,     // "ANNUALLY"
 };
 
-enum OEHeaderTag {
+enum OEHeaderTag : int {
+    OEHT_UNKNOWN = -1,      // a header line whose name is none of these
     OEHT_CONTENTTYPE = 0,   // "CONTENT-TYPE" (MIME header, no keyword here)
     OEHT_CONTENTLENGTH = 1, // "CONTENT-LENGTH" (MIME header, no keyword here)
     OEHT_OFXHEADER = 2,     // "OFXHEADER"

@@ -2,6 +2,7 @@
 
 #include "foundation/oedynarr.h"
 #include "foundation/oememory.h"
+#include "parse/oeparselogger.h"
 #include "platform/oeplatform.h"
 
 #include <mutex>
@@ -48,6 +49,12 @@ unsigned short OEAttachThread(unsigned long threadId) {
     if (FindLocked(threadId)) return 1;
     OEThreadRecord* record = OEMemory::New<OEThreadRecord>(threadId);
     if (!record) return 0;
+    // The record owns the thread's parse log from the start.
+    record->m_parseLog = OEMemory::New<OEParseLogger>();
+    if (!record->m_parseLog) {
+        delete record;
+        return 0;
+    }
     if (!g_threads->Append(record)) {
         delete record;
         return 0;

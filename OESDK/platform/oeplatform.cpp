@@ -26,11 +26,13 @@ MessageFunctor Ops::SetMessageFunctor(MessageFunctor functor) {
 
 void Ops::Message(int severity, int subSeverity, const char* source, int line, const char* function,
                   const char* format, ...) {
-    char text[1024];
-    va_list args;
-    va_start(args, format);
-    std::vsnprintf(text, sizeof text, format ? format : "", args);
-    va_end(args);
+    char text[1024] = "";
+    if (format) {
+        va_list args;
+        va_start(args, format);
+        std::vsnprintf(text, sizeof text, format, args);
+        va_end(args);
+    }
     m_functor(severity, subSeverity, source, line, function, text);
 }
 

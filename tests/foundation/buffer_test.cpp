@@ -10,9 +10,7 @@ TEST(OEBuffer, ConstructionRules) {
     struct Case {
         unsigned long initial, growBy, allocation, increment;
     };
-    for (Case c : {Case{0, 0, 512, 512}, Case{0, 100, 100, 100}, Case{64, 0, 64, 0}, Case{64, 32, 64, 32},
-                   Case{5000000000ul, 1, 4000000000ul, 1}}) {
-        if (c.initial > 100000) continue; // the clamp is checked without allocating 4 GB
+    for (Case c : {Case{0, 0, 512, 512}, Case{0, 100, 100, 100}, Case{64, 0, 64, 0}, Case{64, 32, 64, 32}}) {
         OEBuffer b(c.initial, c.growBy);
         EXPECT_EQ(b.GetBufferAllocation(), c.allocation) << c.initial << "/" << c.growBy;
         EXPECT_EQ(b.GetGrowBy(), c.increment) << c.initial << "/" << c.growBy;
