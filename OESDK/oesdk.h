@@ -40,8 +40,22 @@
 #include "parse/oeparseengine.h"
 #include "parse/oeparser.h"
 
+// Building
+#include "build/oebuilder.h"
+
 // OFX file envelope
 #include "file/oemimeheader.h"
+#include "file/oefile.h"
+
+// Message envelope and statements
+#include "messages/oeaggregate.h"
+#include "messages/oecurrency.h"
+#include "messages/oeaccount.h"
+#include "messages/oetrans.h"
+#include "messages/oesignon.h"
+#include "messages/oemsgset.h"
+#include "messages/oebank.h"
+#include "messages/oeprofile.h"
 
 // Transport
 #include "net/oenetacc.h"

@@ -45,10 +45,30 @@ done
 
 say() { printf '== [%4ds] %s\n' "$((SECONDS - t0))" "$*"; }
 
+# cpu_now: sets CPU_NOW to the CPU seconds (user + system) used so far by the processes this script
+# has waited for. Next to the wall time it shows whether a slow step was busy or waiting for a loaded
+# machine. `times` has to run in this shell, not in a $(...) subshell.
+cpu_now() {
+  local user sys um us sm ss
+  times >"$logs/.times"
+  { read -r _ && read -r user sys; } <"$logs/.times" # line 2: the children, as 1m2.345s 0m0.678s
+  um=${user%%m*} us=${user#*m} sm=${sys%%m*} ss=${sys#*m}
+  us=${us%%.*} ss=${ss%%.*}
+  CPU_NOW=$((10#$um * 60 + 10#$us + 10#$sm * 60 + 10#$ss))
+}
+
+# record NAME START_SECONDS START_CPU: one line of the closing table of step times.
+record() {
+  cpu_now
+  timings+=("$(printf '%6ds %6ds  %s' "$((SECONDS - $2))" "$((CPU_NOW - $3))" "$1")")
+}
+
 # step NAME LOG CMD...: runs CMD, its output into the file LOG ("-": straight through), and records
 # how long it took. A failing step prints its log and counts as one failure.
 step() {
-  local name=$1 logfile=$2 start=$SECONDS rc=0
+  local name=$1 logfile=$2 start=$SECONDS cpu rc=0
+  cpu_now
+  cpu=$CPU_NOW
   shift 2
   say "$name"
   if [ "$logfile" = - ]; then
@@ -56,7 +76,7 @@ step() {
   else
     "$@" >"$logfile" 2>&1 </dev/null || rc=$?
   fi
-  timings+=("$(printf '%6ds  %s' "$((SECONDS - start))" "$name")")
+  record "$name" "$start" "$cpu"
   if [ $rc -ne 0 ]; then
     # Ninja's progress lines ("[12/80] Building ...") say nothing about the failure.
     [ "$logfile" = - ] || grep -Ev '^\[[0-9]+/[0-9]+\] ' "$logfile"
@@ -70,11 +90,13 @@ step() {
 
 # run_ctest LEG BUILD_DIR: runs the leg's tests with ctest's own output and adds its summary up.
 run_ctest() {
-  local leg=$1 dir=$2 start=$SECONDS rc=0 summary
+  local leg=$1 dir=$2 start=$SECONDS cpu rc=0 summary
+  cpu_now
+  cpu=$CPU_NOW
   say "$leg: test"
   ctest --test-dir "$dir" --output-on-failure --timeout 300 -j"$jobs" </dev/null 2>&1 |
     tee "$logs/$leg-ctest.log" || rc=$?
-  timings+=("$(printf '%6ds  %s' "$((SECONDS - start))" "$leg: test")")
+  record "$leg: test" "$start" "$cpu"
   summary=$(grep -E '^[0-9]+% tests passed, [0-9]+ tests? failed out of [0-9]+' "$logs/$leg-ctest.log" | tail -n 1)
   if [ -n "$summary" ]; then
     local f t
@@ -167,6 +189,8 @@ leg_windows() {
   [ -d "$WINEPREFIX" ] && stop_wine
   rm -rf "$WINEPREFIX"
   trap stop_wine EXIT
+  getent hosts localhost >/dev/null ||
+    say "warning: 'localhost' does not resolve here (no /etc/hosts line?): HTTPS tests under wine will fail"
   fresh "$b"
   step "windows: wine prefix" - wine_prefix || return
   step "windows: configure (MinGW-w64 posix)" "$logs/windows-configure.log" \
@@ -188,9 +212,10 @@ for leg in "${legs[@]}"; do
 done
 
 echo
-echo "step times:"
+echo "step times (wall, cpu):"
 printf '%s\n' "${timings[@]}"
-printf '%6ds  total\n' "$((SECONDS - t0))"
+cpu_now
+printf '%6ds %6ds  total\n' "$((SECONDS - t0))" "$CPU_NOW"
 printf '%s\n' "${results[@]}"
 echo "$passed passed, $failed failed"
 [ "$failed" -eq 0 ]

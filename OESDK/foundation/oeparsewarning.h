@@ -8,7 +8,9 @@
 // Tag numbers: the enumerators are generated in tags/oetagid.h.
 enum OETagID : unsigned int;
 
-enum OEParseWarning {
+// Fixed underlying type: a code from outside the list is still a valid value, which the
+// lookups refuse by range check.
+enum OEParseWarning : int {
     OEPW_UNKNOWNEXCEPTION = 0,
     OEPW_UNKNOWNTAG = 1,
     OEPW_INVALIDAGG = 2,

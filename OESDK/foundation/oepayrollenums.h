@@ -1,19 +1,20 @@
 // Enumerations of the payroll message set whose values travel as keywords (see
-// OEPayrollDataConversion).
+// OEPayrollDataConversion). Fixed underlying type int, as in oeenums.h: any int is a valid value that
+// the conversions range-check.
 #ifndef OESDK_FOUNDATION_OEPAYROLLENUMS_H
 #define OESDK_FOUNDATION_OEPAYROLLENUMS_H
 
-enum OEAccrualPeriod {
+enum OEAccrualPeriod : int {
     OEAP_YEARLY = 0,  // "YEARLY"
     OEAP_PAYROLL = 1, // "PAYROLL"
     OEAP_HOURLY = 2,  // "HOURLY"
 };
 
-enum OEBenefitType {
+enum OEBenefitType : int {
     OEBENT_BENEFITNONE = 0, // "BENEFITNONE"
 };
 
-enum OECalculationType {
+enum OECalculationType : int {
     OECALC_FLATRATE = 0, // "FLATRATE"
     OECALC_PCTGROSS = 1, // "PCTGROSS"
     OECALC_PCTNET = 2,   // "PCTNET"
@@ -22,7 +23,7 @@ enum OECalculationType {
     OECALC_TAXTABLE = 5, // "TAXTABLE"
 };
 
-enum OEDirectDepositMode {
+enum OEDirectDepositMode : int {
     OEDDM_NO = 0,                 // "NO"
     OEDDM_APPLIED = 1,            // "APPLIED"
     OEDDM_ACTIVE = 2,             // "ACTIVE"
@@ -31,19 +32,19 @@ enum OEDirectDepositMode {
     OEDDM_PENDING_ENROLLMENT = 5, // "PENDING_ENROLLMENT"
 };
 
-enum OESeasonalType {
+enum OESeasonalType : int {
     OESEAS_UNKNOWN = 0,     // "UNKNOWN"
     OESEAS_SEASONAL = 1,    // "SEASONAL"
     OESEAS_NONSEASONAL = 2, // "NONSEASONAL"
 };
 
-enum OEEmployeeGender {
+enum OEEmployeeGender : int {
     OEGEN_UNKNOWN = 0, // "UNKNOWN"
     OEGEN_FEMALE = 1,  // "FEMALE"
     OEGEN_MALE = 2,    // "MALE"
 };
 
-enum OEEmployeeType {
+enum OEEmployeeType : int {
     OEET_REG = 0,       // "REG"
     OEET_OFFICER = 1,   // "OFFICER"
     OEET_STATUTORY = 2, // "STATUTORY"
@@ -51,14 +52,14 @@ enum OEEmployeeType {
     OEET_REP = 4,       // "REP"
 };
 
-enum OEFederalFilingStatus {
+enum OEFederalFilingStatus : int {
     OEFFS_SINGLE = 0,             // "SINGLE"
     OEFFS_MARRIED = 1,            // "MARRIED"
     OEFFS_HEADOFHOUSE = 2,        // "HEADOFHOUSE"
     OEFFS_HEADOFHOUSE_W42020 = 3, // "HEADOFHOUSE_W42020"
 };
 
-enum OEFederalTax {
+enum OEFederalTax : int {
     OEFT_FIT = 0,          // "FIT"
     OEFT_SS_ER = 1,        // "SS_ER"
     OEFT_SS_EE = 2,        // "SS_EE"
@@ -72,49 +73,49 @@ enum OEFederalTax {
     OEFT_MED_EE_TIPS = 10, // "MED_EE_TIPS"
 };
 
-enum OEFederalTaxPaymentFrequency {
+enum OEFederalTaxPaymentFrequency : int {
     OEFTPF_QTRLY = 0,    // "QTRLY"
     OEFTPF_MONTHLY = 1,  // "MONTHLY"
     OEFTPF_SEMIWKLY = 2, // "SEMIWKLY"
     OEFTPF_DAILY = 3,    // "DAILY"
 };
 
-enum OEFederalW4FilingYear {
+enum OEFederalW4FilingYear : int {
     OEFW4_NONE = 0,         // ""
     OEFW4_2019ORBEFORE = 1, // "2019ORBEFORE"
     OEFW4_2020ANDLATER = 2, // "2020ANDLATER"
 };
 
-enum OEGLMode {
+enum OEGLMode : int {
     OEGLM_PENDING_ENROLLMENT = 0, // "PENDING_ENROLLMENT"
     OEGLM_ACTIVE = 1,             // "ACTIVE"
     OEGLM_CANCELLED = 2,          // "CANCELLED"
     OEGLM_PENDING_SETUP = 3,      // "PENDING_SETUP"
 };
 
-enum OEHealthCareLevel {
+enum OEHealthCareLevel : int {
     OEHCL_EMPLOYEE = 0,   // "EMPLOYEE"
     OEHCL_SPOUSE = 1,     // "SPOUSE"
     OEHCL_DEPENDENTS = 2, // "DEPENDENTS"
 };
 
-enum OEHealthCareProvider {
+enum OEHealthCareProvider : int {
     OEHCP_EMPLOYEE = 0, // "EMPLOYEE"
     OEHCP_COMPANY = 1,  // "COMPANY"
 };
 
-enum OEPayCheckType {
+enum OEPayCheckType : int {
     OEPCT_PAYCHK = 0, // "PAYCHK"
     OEPCT_YTDADJ = 1, // "YTDADJ"
 };
 
-enum OEPayType {
+enum OEPayType : int {
     OEPAY_REG = 0,  // "REG"
     OEPAY_SICK = 1, // "SICK"
     OEPAY_VAC = 2,  // "VAC"
 };
 
-enum OEPayrollFrequency {
+enum OEPayrollFrequency : int {
     OEPF_DAILY = 0,       // "DAILY"
     OEPF_WEEKLY = 1,      // "WEEKLY"
     OEPF_BIWEEKLY = 2,    // "BIWEEKLY"
@@ -124,7 +125,7 @@ enum OEPayrollFrequency {
     OEPF_YEARLY = 6,      // "YEARLY"
 };
 
-enum OEPayrollItemSpecialType {
+enum OEPayrollItemSpecialType : int {
     OEPIST_COMCARE = 0,      // "COMCARE"
     OEPIST_COSSEC = 1,       // "COSSEC"
     OEPIST_EEMCARE = 2,      // "EEMCARE"
@@ -141,13 +142,13 @@ enum OEPayrollItemSpecialType {
     OEPIST_WORKER_COMP = 13, // "WORKER_COMP"
 };
 
-enum OEPayrollTestingType {
+enum OEPayrollTestingType : int {
     OEPTT_ACH = 0, // "ACH"
     OEPTT_TAX = 1, // "TAX"
     OEPTT_Y = 2,   // "Y"
 };
 
-enum OEPayrollTxType {
+enum OEPayrollTxType : int {
     OEPTX_CARRYOVER = 0,     // "CARRYOVER"
     OEPTX_PRIORPMT = 1,      // "PRIORPMT"
     OEPTX_LIABADJ = 2,       // "LIABADJ"
@@ -158,14 +159,14 @@ enum OEPayrollTxType {
     OEPTX_FUNDSTRANSFER = 7, // "FUNDSTRANSFER"
 };
 
-enum OEPayrollType {
+enum OEPayrollType : int {
     OEPRT_REG = 0,       // "REG"
     OEPRT_AGRI = 1,      // "AGRI"
     OEPRT_MSQE = 2,      // "MSQE"
     OEPRT_HOUSEHOLD = 3, // "HOUSEHOLD"
 };
 
-enum OEStateTax {
+enum OEStateTax : int {
     OESTX_SIT = 0,    // "SIT"
     OESTX_SUI_ER = 1, // "SUI_ER"
     OESTX_SUI_EE = 2, // "SUI_EE"
@@ -173,7 +174,7 @@ enum OEStateTax {
     OESTX_SDI_EE = 4, // "SDI_EE"
 };
 
-enum OETaxFormLine {
+enum OETaxFormLine : int {
     OETFL_NONE = 0,           // "NONE"
     OETFL_COMP = 1,           // "COMP"
     OETFL_NONTAXSICK = 2,     // "NONTAXSICK"
@@ -249,12 +250,12 @@ enum OETaxFormLine {
     OETFL_TTT46 = 72,         // "TTT46"
 };
 
-enum OETaxPaymentType {
+enum OETaxPaymentType : int {
     OETPT_LIAB = 0, // "LIAB"
     OETPT_PMT = 1,  // "PMT"
 };
 
-enum OETaxServiceMode {
+enum OETaxServiceMode : int {
     OETSM_NO = 0,         // "NO"
     OETSM_APPLIED = 1,    // "APPLIED"
     OETSM_ACTIVE = 2,     // "ACTIVE"

@@ -16,6 +16,44 @@ class OEString;
 class OEDataObj;
 class OEParseException;
 class OEMIMEHeader;
+class OEFile;
+class OEFileRq;
+class OEFileRs;
+class OECurrency;
+class OERequest;
+class OEResponse;
+class OEMessageSetRs;
+class OEMessageSetRq;
+class OESyncRq;
+class OESyncRs;
+class OETransRq;
+class OELanguage;
+class OEStatus;
+class OETransRs;
+class OESignOnRs;
+class OESignOnRq;
+class OEFI;
+class OEPinChangeRq;
+class OEPinChangeRs;
+class OEMessageSetCore;
+class OEMessageSetVersion;
+class OEMessageSetProfile;
+class OEMessageSetList;
+class OEBalance;
+class OEBankAccount;
+class OEBankStatementRs;
+class OEBankStatementRq;
+class OEBankStatementTx;
+class OEIncTransaction;
+class OELedgerBalance;
+class OEAvailableBalance;
+class OEBankTransactionList;
+class OECCAccount;
+class OECCStatementRs;
+class OECCStatementRq;
+class OEPayee;
+class OEPayee2;
+class OEWarning;
 
 class OE_API OEDataObjFactory {
 public:
@@ -33,6 +71,46 @@ public:
     virtual OEDataObj* NewDataObj(unsigned short version);
     virtual OEParseException* NewParseException();
     virtual OEMIMEHeader* NewMIMEHeader();
+    // The operations of the file, envelope and statement classes (their bodies live with the
+    // classes, in messages/oefactory_messages.cpp), in slot order.
+    virtual OEFile* NewFile(unsigned short version);
+    virtual OEFileRq* NewFileRq(unsigned short version);
+    virtual OEFileRs* NewFileRs(unsigned short version);
+    virtual OECurrency* NewCurrency(unsigned short version);
+    virtual OERequest* NewRequest(unsigned short version);
+    virtual OEResponse* NewResponse(unsigned short version);
+    virtual OEMessageSetRs* NewMessageSetRs(unsigned short version);
+    virtual OEMessageSetRq* NewMessageSetRq(unsigned short version);
+    virtual OESyncRq* NewSyncRq(unsigned short version);
+    virtual OESyncRs* NewSyncRs(unsigned short version);
+    virtual OETransRq* NewTransRq(unsigned short version);
+    virtual OELanguage* NewLanguage(unsigned short version);
+    virtual OEStatus* NewStatus(unsigned short version);
+    virtual OETransRs* NewTransRs(unsigned short version);
+    virtual OESignOnRs* NewSignOnRs(unsigned short version);
+    virtual OESignOnRq* NewSignOnRq(unsigned short version);
+    virtual OEFI* NewFI(unsigned short version);
+    virtual OEPinChangeRq* NewPinChangeRq(unsigned short version);
+    virtual OEPinChangeRs* NewPinChangeRs(unsigned short version);
+    virtual OEMessageSetCore* NewMessageSetCore(unsigned short version);
+    virtual OEMessageSetVersion* NewMessageSetVersion(unsigned short version);
+    virtual OEMessageSetProfile* NewMessageSetProfile(unsigned short version);
+    virtual OEMessageSetList* NewMessageSetList(unsigned short version);
+    virtual OEBalance* NewBalance(unsigned short version);
+    virtual OEBankAccount* NewBankAccount(unsigned short version);
+    virtual OEBankStatementRs* NewBankStatementRs(unsigned short version);
+    virtual OEBankStatementRq* NewBankStatementRq(unsigned short version);
+    virtual OEBankStatementTx* NewBankStatementTx(unsigned short version);
+    virtual OEIncTransaction* NewIncTransaction(unsigned short version);
+    virtual OELedgerBalance* NewLedgerBalance(unsigned short version);
+    virtual OEAvailableBalance* NewAvailableBalance(unsigned short version);
+    virtual OEBankTransactionList* NewBankTransactionList(unsigned short version);
+    virtual OECCAccount* NewCCAccount(unsigned short version);
+    virtual OECCStatementRs* NewCCStatementRs(unsigned short version);
+    virtual OECCStatementRq* NewCCStatementRq(unsigned short version);
+    virtual OEPayee* NewPayee(unsigned short version);
+    virtual OEPayee2* NewPayee2(unsigned short version);
+    virtual OEWarning* NewWarning(unsigned short version);
     // The next creation operations go here, each added by the change that brings its class,
     // strictly in this order so that the slot order never changes: NewFile, NewFileRq, NewFileRs,
     // NewCurrency, NewRequest, NewResponse, NewEfpRequest, NewMessageSetRs, NewMessageSetRq,

@@ -1,0 +1,467 @@
+#include "build/oebuilder.h"
+
+#include "foundation/oethread.h"
+#include "parse/oeutility.h"
+#include "tags/oedataobj.h"
+#include "tags/oetagdictionary.h"
+
+#include <cstdio>
+#include <cstring>
+#include <string>
+#include <vector>
+
+const char OEBuilder::OE_NEW_LINE[] = "\n";
+
+namespace {
+
+// Rows 2-4 of the plain table and rows 2-6 of the XML-quote table (never "nbsp": a space is
+// never written as an entity).
+const char* EntityFor(char c) {
+    switch (c) {
+    case '>':
+        return "&gt;";
+    case '<':
+        return "&lt;";
+    case '&':
+        return "&amp;";
+    case '"':
+        return "&quot;";
+    case '\'':
+        return "&apos;";
+    default:
+        return nullptr;
+    }
+}
+
+inline bool NeedsEscape(char c, bool xmlQuote) {
+    return c == '>' || c == '<' || c == '&' || (xmlQuote && (c == '"' || c == '\''));
+}
+
+} // namespace
+
+OEBuilder::OEBuilder(OEBuildStringCrLfOpt crlf, unsigned short elemEndTags)
+    : m_dictionary(OETagDictionary::TheOETagDictionary()), m_buffer(nullptr), m_stringOpt(OEBSO_STRICT),
+      m_crlf(crlf), m_elemEndTags(elemEndTags), m_failedObject(nullptr) {}
+
+OEBuilder::~OEBuilder() {}
+
+void OEBuilder::Put(const char* text, unsigned long length) {
+    if (length == 0) return;
+    if (length < 65535)
+        m_buffer->Write(text, static_cast<unsigned short>(length));
+    else
+        m_buffer->WriteLarge(text, length);
+}
+
+void OEBuilder::Put(const char* text) {
+    Put(text, std::strlen(text));
+}
+
+const char* OEBuilder::TagText(OETagID tag) const {
+    // Every tag of the dictionary by id, looked up once for the process.
+    static const std::vector<const char*> names = [] {
+        std::vector<const char*> table;
+        OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+        unsigned n = NumberOfOEDictionaryEntry();
+        table.assign(n + 1, nullptr);
+        for (unsigned id = 1; d && id <= n; ++id) {
+            const char* name = d->GetTagString(static_cast<OETagID>(id));
+            table[id] = name && *name ? name : nullptr;
+        }
+        return table;
+    }();
+    if (!m_dictionary || tag == 0 || tag >= names.size()) return nullptr;
+    return names[tag];
+}
+
+OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringOpt stringOpt,
+                               unsigned short checkRequired, unsigned short xmlQuote) {
+    if (!buffer || !root) return OEBS_BADARGUMENT;
+    OEThreadState::SetErrorCode(OETE_NONE);
+    m_buffer = buffer;
+    m_stringOpt = stringOpt;
+    OEUtility::SetXmlQuoteMacros(xmlQuote);
+    OEBuildStatus status = static_cast<OEBuildStatus>(root->Build(this));
+    if (status == OEBS_OK && checkRequired) {
+        OEDataObj* missingIn = root;
+        OETagID missingTag = OETAG_NONE;
+        if (!OEUtility::AllRequiredPresent(missingIn, &missingIn, &missingTag)) {
+            SetFailedObject(missingIn);
+            status = OEBS_MISSINGREQUIRED;
+        }
+    }
+    if (OEThreadState::GetErrorCode() == OETE_OUTOFMEMORY) {
+        SetFailedObject(root);
+        return OEBS_OUTOFMEMORY;
+    }
+    return status;
+}
+
+OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name) {
+    if (!m_buffer || !name) return OEBS_BADARGUMENT;
+    size_t n = std::strlen(name);
+    char small[128];
+    if (n + 4 > sizeof(small)) {
+        Put(type == OETT_END ? "</" : "<");
+        Put(name, n);
+        Put(type == OETT_ELEMENT ? ">" : ">\n");
+        return OEBS_OK;
+    }
+    // One write per tag: "<", optional "/", the name, ">" and, except for elements, LF.
+    char* p = small;
+    *p++ = '<';
+    if (type == OETT_END) *p++ = '/';
+    std::memcpy(p, name, n);
+    p += n;
+    *p++ = '>';
+    if (type != OETT_ELEMENT) *p++ = '\n';
+    Put(small, static_cast<unsigned long>(p - small));
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddTagStart(OETagID tag) {
+    const char* name = TagText(tag);
+    return name ? AddTag(OETT_START, name) : OEBS_BADARGUMENT;
+}
+
+OEBuildStatus OEBuilder::AddTagEnd(OETagID tag) {
+    const char* name = TagText(tag);
+    return name ? AddTag(OETT_END, name) : OEBS_BADARGUMENT;
+}
+
+OEBuildStatus OEBuilder::AddTagElement(OETagID tag) {
+    const char* name = TagText(tag);
+    return name ? AddTag(OETT_ELEMENT, name) : OEBS_BADARGUMENT;
+}
+
+OEBuildStatus OEBuilder::AddTagElementEnd(OETagID tag) {
+    return AddTagEnd(tag);
+}
+
+OEBuildStatus OEBuilder::AddBlankLine() {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    int v = m_crlf;
+    if (v == 2 || v == 4 || v == 5 || v == 7) Put("\r", 1);
+    if (v == 2 || v == 3 || v == 5 || v == 6) Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddHeader(OEHeaderTag tag, const OEString& value) {
+    if (value.GetStrLength() == 0) return OEBS_OK;
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    OEString name;
+    if (!OEDataConversion::HeaderTagToString(tag, name) || name.IsEmpty()) return OEBS_NOTEXTFORM;
+    Put(name.c_str(), name.GetStrLength());
+    Put(":", 1);
+    Put(value.c_str(), value.GetStrLength());
+    return AddBlankLine();
+}
+
+OEBuildStatus OEBuilder::AddOESShort(short value) {
+    return AddOESLong(value);
+}
+
+OEBuildStatus OEBuilder::AddOEUShort(unsigned short value, char pad, unsigned short width) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    char format[16];
+    std::snprintf(format, sizeof(format), "%%%c%uu", pad, static_cast<unsigned>(width));
+    char text[80];
+    int n = std::snprintf(text, sizeof(text), format, static_cast<unsigned>(value));
+    if (n < 0) return OEBS_NOTEXTFORM;
+    if (n >= static_cast<int>(sizeof(text))) n = sizeof(text) - 1;
+    Put(text, static_cast<unsigned long>(n));
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddOEUShort(unsigned short value) {
+    return AddOEULong(value);
+}
+
+OEBuildStatus OEBuilder::AddOESLong(long value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    char text[32];
+    int n = std::snprintf(text, sizeof(text), "%ld\n", value);
+    Put(text, static_cast<unsigned long>(n));
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddOEULong(unsigned long value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    char text[32];
+    int n = std::snprintf(text, sizeof(text), "%lu\n", value);
+    Put(text, static_cast<unsigned long>(n));
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddOEChar(char value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    char text[2] = {value, '\n'};
+    Put(text, 2);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddOEBoolean(unsigned short value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    Put(value ? "Y\n" : "N\n", 2);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddString(const OEString* value, OEBuildStringMacroOpt macros,
+                                   OEBuildStringCrLfOpt crlf) {
+    if (!value) return OEBS_BLANKVALUE;
+    return AddString(*value, macros, crlf);
+}
+
+OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt macros,
+                                   OEBuildStringCrLfOpt crlf) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    const char* text = value.c_str();
+    unsigned long length = value.GetStrLength();
+    bool valid = value.IsValid() != 0;
+    bool tooLong = length > value.SpecLength();
+    if (!valid && m_stringOpt == OEBSO_STRICT) return tooLong ? OEBS_STRINGTOOLONG : OEBS_INVALIDSTRING;
+    bool truncate = !valid && tooLong; // lenient: cut the working copy to the spec length
+
+    if (value.GetEncoding() == OESE_CDATA) {
+        // The text itself, then a CDATA section holding the same text: kept as the builder's form.
+        std::string work(text, length);
+        work += "<![CDATA[";
+        work.append(text, length);
+        work += "]]>";
+        if (truncate && work.size() > value.SpecLength()) work.resize(value.SpecLength());
+        Put(work.data(), work.size());
+    } else if (macros == OEBSM_MACROS) {
+        bool xmlQuote = OEUtility::GetXmlQuoteMacros() != 0;
+        const char* p = text;
+        const char* end = text + length;
+        while (p < end && !NeedsEscape(*p, xmlQuote)) ++p;
+        if (p == end) {
+            Put(text, truncate ? value.SpecLength() : length);
+        } else {
+            std::string work(text, static_cast<size_t>(p - text));
+            for (; p < end; ++p) {
+                if (NeedsEscape(*p, xmlQuote))
+                    work += EntityFor(*p);
+                else
+                    work += *p;
+            }
+            if (truncate && work.size() > value.SpecLength()) work.resize(value.SpecLength());
+            Put(work.data(), work.size());
+        }
+    } else {
+        Put(text, truncate ? value.SpecLength() : length);
+    }
+    if (crlf == OEBCL_NEWLINE) Put(OE_NEW_LINE, 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddPrecisionInteger(const OEPrecisionInteger& value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    if (!value.IsValid()) return OEBS_NOTEXTFORM;
+    const char* text = static_cast<const char*>(const_cast<OEPrecisionInteger&>(value));
+    if (!text) return OEThreadState::GetErrorCode() == OETE_OUTOFMEMORY ? OEBS_OUTOFMEMORY : OEBS_NOTEXTFORM;
+    Put(text);
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddAmount(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddQuantity(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddUnitPrice(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+OEBuildStatus OEBuilder::AddRate(const OEPrecisionInteger& value) {
+    return AddPrecisionInteger(value);
+}
+
+OEBuildStatus OEBuilder::AddDateTime(const OEDateTime& value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    OEString text;
+    if (!const_cast<OEDateTime&>(value).GetDateString(text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddTime(const OETime& value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    OEString text;
+    if (!const_cast<OETime&>(value).GetTimeString(text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddBankTxType(OEBankTxType value) {
+    OEString text;
+    if (!OEDataConversion::BankTxToString(value, text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddBankAccountType(OEBankAccountType value) {
+    OEString text;
+    if (!OEDataConversion::BankAccountToString(value, text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddOFXSecurity(OEOFXSecurity value) {
+    OEString text;
+    if (!OEDataConversion::OFXSecurityToString(value, text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddSyncMode(OESyncMode value) {
+    OEString text;
+    if (!OEDataConversion::SyncModeToString(value, text)) return OEBS_NOTEXTFORM;
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::AddServerID(const OEString36& value) {
+    return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
+}
+OEBuildStatus OEBuilder::AddPayeeID(const OEString12& value) {
+    return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
+}
+
+OEBuildStatus OEBuilder::AddLanguage(const OELanguage& value) {
+    OEString text;
+    if (!OEDataConversion::LanguageToString(value, text)) return OEBS_NOTEXTFORM;
+    OEString3 code(text);
+    return AddString(code, OEBSM_MACROS, OEBCL_NEWLINE);
+}
+
+OEBuildStatus OEBuilder::FinishElement(OETagID tag, OEBuildStatus valueStatus) {
+    if (valueStatus == OEBS_OK && m_elemEndTags == 1) return AddTagElementEnd(tag);
+    return valueStatus;
+}
+
+OEBuildStatus OEBuilder::AddTagOEServerID(OETagID tag, const OEString36& value) {
+    if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddServerID(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOELanguage(OETagID tag, const OELanguage& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddLanguage(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEPayeeID(OETagID tag, const OEString12& value) {
+    if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddPayeeID(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEBoolean(OETagID tag, unsigned short value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOEBoolean(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEUShort(OETagID tag, unsigned short value, char pad, unsigned short width) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOEUShort(value, pad, width));
+}
+
+OEBuildStatus OEBuilder::AddTagOEUShort(OETagID tag, unsigned short value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOEUShort(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOESShort(OETagID tag, short value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOESShort(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEULong(OETagID tag, unsigned long value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOEULong(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOESLong(OETagID tag, long value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddOESLong(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEString(OETagID tag, const OEString& value) {
+    if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddString(value, OEBSM_MACROS, OEBCL_NEWLINE));
+}
+
+OEBuildStatus OEBuilder::AddTagOEString(OETagID tag, const OEString* value) {
+    if (!value) return OEBS_BLANKVALUE;
+    return AddTagOEString(tag, *value);
+}
+
+OEBuildStatus OEBuilder::AddTagOEAmount(OETagID tag, const OEPrecisionInteger& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddAmount(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEDateTime(OETagID tag, const OEDateTime& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddDateTime(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOETime(OETagID tag, const OETime& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddTime(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEQuantity(OETagID tag, const OEPrecisionInteger& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddQuantity(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEUnitPrice(OETagID tag, const OEPrecisionInteger& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddUnitPrice(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOERate(OETagID tag, const OEPrecisionInteger& value) {
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddRate(value));
+}
+
+OEBuildStatus OEBuilder::AddTagOEKeyword(OETagID tag, const char* keyword) {
+    if (!keyword || !*keyword) return OEBS_NOTEXTFORM;
+    OEBuildStatus s = AddTagElement(tag);
+    if (s != OEBS_OK) return s;
+    // Keywords are the library's own constant texts: nothing to escape, no bound to check.
+    Put(keyword);
+    Put(OE_NEW_LINE, 1);
+    return FinishElement(tag, OEBS_OK);
+}
+
+unsigned short OEBuilder::AddBuffer(OEBuffer* other) {
+    if (!m_buffer || !other) return 1;
+    return m_buffer->Write(other) != OEBR_SUCCESS ? 1 : 0;
+}
+
+OEBuildStatus OEPayrollBuilder::AddPayrollAmount(const OEPayrollAmount& value) {
+    const char* text = static_cast<const char*>(const_cast<OEPayrollAmount&>(value));
+    if (text) Put(text);
+    Put("\n", 1);
+    return OEBS_OK;
+}
+
+OEBuildStatus OEPayrollBuilder::AddPayrollDateTime(const OEPayrollDateTime& value) {
+    OEString text;
+    const_cast<OEPayrollDateTime&>(value).GetDateString(text);
+    Put(text.c_str(), text.GetStrLength());
+    Put("\n", 1);
+    return OEBS_OK;
+}

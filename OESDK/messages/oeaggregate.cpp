@@ -1,0 +1,700 @@
+#include "messages/oeaggregate.h"
+
+#include "build/oebuilder.h"
+#include "foundation/oememory.h"
+#include "foundation/oeparsewarning.h"
+#include "foundation/oethread.h"
+
+#include <cstdio>
+#include <cstring>
+#include <new>
+#include <string>
+
+namespace {
+
+// Case-insensitive keyword match over a table; the index or -1.
+int MatchKeyword(const OEKeywordTable* table, const char* text) {
+    if (!table) return -1;
+    for (unsigned short i = 0; i < table->m_count; ++i) {
+        const char* a = table->m_words[i];
+        const char* b = text;
+        while (*a && *b) {
+            char ca = *a, cb = *b;
+            if (ca >= 'a' && ca <= 'z') ca = static_cast<char>(ca - 32);
+            if (cb >= 'a' && cb <= 'z') cb = static_cast<char>(cb - 32);
+            if (ca != cb) break;
+            ++a;
+            ++b;
+        }
+        if (!*a && !*b) return i;
+    }
+    return -1;
+}
+
+// Strict decimal number: optional sign, digits only.
+bool ParseLong(const char* text, bool allowSign, long long& out) {
+    const char* p = text;
+    bool negative = false;
+    if (allowSign && (*p == '-' || *p == '+')) negative = *p++ == '-';
+    if (!*p) return false;
+    long long value = 0;
+    for (; *p; ++p) {
+        if (*p < '0' || *p > '9') return false;
+        value = value * 10 + (*p - '0');
+        if (value > 0xFFFFFFFFLL) return false;
+    }
+    out = negative ? -value : value;
+    return true;
+}
+
+} // namespace
+
+OEAggregate::OEAggregate(unsigned short version) : OEDataObj(version) {}
+
+const unsigned char* OEAggregateDesc::Bits() const {
+    const unsigned char* bits = m_bits.load(std::memory_order_acquire);
+    if (bits) return bits;
+    unsigned char* fresh = new (std::nothrow) unsigned char[m_fieldCount ? m_fieldCount : 1];
+    if (!fresh) return nullptr;
+    for (unsigned short i = 0; i < m_fieldCount; ++i) {
+        fresh[i] = 0xFF;
+        for (unsigned short k = 0; k < m_validCount && k < 96; ++k) {
+            if (m_valid[k].m_tag == m_fields[i].m_tag) {
+                fresh[i] = static_cast<unsigned char>(k);
+                break;
+            }
+        }
+    }
+    const unsigned char* expected = nullptr;
+    if (!m_bits.compare_exchange_strong(expected, fresh, std::memory_order_acq_rel)) {
+        delete[] fresh; // another thread won; the tables live as long as the process
+        return expected;
+    }
+    return fresh;
+}
+
+unsigned short OEAggregate::RowPresent(unsigned short index) const {
+    const OEAggregateDesc& d = Describe();
+    const unsigned char* bits = d.Bits();
+    if (!bits) return ValidateTag(d.m_fields[index].m_tag);
+    unsigned k = bits[index];
+    if (k == 0xFF) return 0;
+    // A tag whose first row does not apply at this version may have a later row that does.
+    if (!(d.m_valid[k].m_versionMask & GetMsgSetVersion())) return ValidateTag(d.m_fields[index].m_tag);
+    return (GetPresentWord(static_cast<unsigned short>(k / 32)) >> (k % 32)) & 1u;
+}
+
+// Members own their children (OEOwnedChild, OEDataObjList), so they go with the members.
+OEAggregate::~OEAggregate() {}
+
+OEOwnedChild::~OEOwnedChild() {
+    delete m_obj;
+}
+
+void OEAggregate::DeleteChildren() {
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* row = &d.m_fields[i];
+        if (row->m_kind == OEFK_CHILD) {
+            OEDataObj** slot = static_cast<OEDataObj**>(Slot(row));
+            delete *slot;
+            *slot = nullptr;
+        } else if (row->m_kind == OEFK_LIST) {
+            static_cast<OEDataObjList*>(Slot(row))->DeleteAll();
+        }
+    }
+}
+
+unsigned short OEAggregate::GetArrayOfValidTags(OEArrayOfTags& tags) const {
+    const OEAggregateDesc& d = Describe();
+    tags.Set(d.m_valid, d.m_validCount);
+    return 1;
+}
+
+unsigned short OEAggregate::GetArrayOfRequiredTags(OEArrayOfTags& tags) const {
+    const OEAggregateDesc& d = Describe();
+    tags.Set(d.m_required, d.m_requiredCount);
+    return 1;
+}
+
+const OEFieldRow* OEAggregate::FindRow(OETagID tag) const {
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (d.m_fields[i].m_tag == tag) return &d.m_fields[i];
+    return nullptr;
+}
+
+OEParseStatus OEAggregate::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    const OEFieldRow* row = FindRow(entry->m_id);
+    if (!row || (row->m_kind != OEFK_CHILD && row->m_kind != OEFK_LIST) || !IsValidTag(entry->m_id))
+        return OEPS_INVALID;
+    return StartChild(row, entry);
+}
+
+OEParseStatus OEAggregate::StartChild(const OEFieldRow* row, const OETagDictionaryEntry* entry) {
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return OEPS_NORESOURCE;
+    if (row->m_kind == OEFK_CHILD) {
+        OEDataObj** slot = static_cast<OEDataObj**>(Slot(row));
+        if (*slot) {
+            OELogParseWarning(OEPW_EXTRAAGG, "", "", entry->m_id, this);
+            SetChildObj(row->m_tag, nullptr);
+        }
+        OEDataObj* child = row->m_make(factory, GetMsgSetVersion());
+        if (!child) {
+            OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+            return OEPS_NORESOURCE;
+        }
+        *slot = child;
+        return PushAndSetObject(child, entry->m_id);
+    }
+    OEDataObj* child = row->m_make(factory, GetMsgSetVersion());
+    if (!child) {
+        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+        return OEPS_NORESOURCE;
+    }
+    OEDataObjList* list = static_cast<OEDataObjList*>(Slot(row));
+    if (!list->Append(child)) {
+        delete child;
+        return OEPS_NORESOURCE;
+    }
+    return PushAndSetObject(child, entry->m_id);
+}
+
+OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
+    if (!entry) return OEPS_INVALID;
+    const OEFieldRow* row = FindRow(entry->m_id);
+    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) return OEPS_INVALID;
+    SetFromText(entry->m_id, value);
+    return OEPS_OK;
+}
+
+unsigned short OEAggregate::RowApplies(unsigned short index) const {
+    const OEAggregateDesc& d = Describe();
+    const unsigned char* bits = d.Bits();
+    if (!bits || bits[index] == 0xFF) return IsValidTag(d.m_fields[index].m_tag);
+    if (d.m_valid[bits[index]].m_versionMask & GetMsgSetVersion()) return 1;
+    return IsValidTag(d.m_fields[index].m_tag); // a later row of the same tag may apply
+}
+
+unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row) return 0;
+    unsigned short index = static_cast<unsigned short>(row - Describe().m_fields);
+    if (!RowApplies(index)) return 0;
+    void* slot = Slot(row);
+    const char* s = text.c_str();
+    switch (row->m_kind) {
+    case OEFK_TEXT: {
+        OEString* str = static_cast<OEString*>(slot);
+        unsigned short spec = str->SpecLength();
+        *str = text;
+        str->SetSpecLength(spec);
+        if (text.GetStrLength() && str->IsNull()) return 3; // no memory for the value
+        if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
+        SetTag(tag);
+        return 1;
+    }
+    // A value not yet present converts in place (its field is not read while unmarked); one that
+    // is present converts through a copy, so that a refused text leaves the old value.
+    case OEFK_AMOUNT: {
+        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
+        if (!RowPresent(index)) {
+            if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
+        } else {
+            OEPrecisionInteger value;
+            if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
+            *field = value;
+        }
+        SetTag(tag);
+        return 1;
+    }
+    case OEFK_DATETIME: {
+        OEDateTime* field = static_cast<OEDateTime*>(slot);
+        if (!RowPresent(index)) {
+            if (!field->ConvertStringToOEDateTime(s)) break;
+        } else {
+            OEDateTime value;
+            if (!value.ConvertStringToOEDateTime(s)) break;
+            *field = value;
+        }
+        SetTag(tag);
+        return 1;
+    }
+    case OEFK_TEXTLIST:
+        return AppendText(tag, text);
+    case OEFK_ENUM: {
+        int index = MatchKeyword(row->m_keywords, s);
+        if (index < 0) break;
+        *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(index);
+        SetTag(tag);
+        return 1;
+    }
+    case OEFK_BOOL: {
+        if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
+        *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
+        SetTag(tag);
+        return 1;
+    }
+    case OEFK_USHORT:
+    case OEFK_ULONG:
+    case OEFK_SLONG: {
+        long long value = 0;
+        if (!ParseLong(s, row->m_kind == OEFK_SLONG, value)) break;
+        if (row->m_kind == OEFK_USHORT) {
+            if (value > 65535) {
+                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                return 0;
+            }
+            *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(value);
+        } else if (row->m_kind == OEFK_ULONG) {
+            *static_cast<unsigned long*>(slot) = static_cast<unsigned long>(value);
+        } else {
+            if (value > 2147483647LL || value < -2147483648LL) {
+                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                return 0;
+            }
+            *static_cast<long*>(slot) = static_cast<long>(value);
+        }
+        SetTag(tag);
+        return 1;
+    }
+    default:
+        return 0;
+    }
+    OELogParseWarning(OEPW_BADFORMAT, s, "", tag, this);
+    return 0;
+}
+
+unsigned short OEAggregate::SetText(OETagID tag, const OEString& value) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_TEXT || !IsValidTag(tag)) return 0;
+    OEString* str = static_cast<OEString*>(Slot(row));
+    unsigned short spec = str->SpecLength();
+    *str = value;
+    str->SetSpecLength(spec);
+    return SetTag(tag);
+}
+
+unsigned short OEAggregate::SetAmount(OETagID tag, const OEPrecisionInteger& value) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_AMOUNT || !IsValidTag(tag)) return 0;
+    *static_cast<OEPrecisionInteger*>(Slot(row)) = value;
+    return SetTag(tag);
+}
+
+unsigned short OEAggregate::SetDateTime(OETagID tag, const OEDateTime& value) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_DATETIME || !IsValidTag(tag)) return 0;
+    *static_cast<OEDateTime*>(Slot(row)) = value;
+    return SetTag(tag);
+}
+
+unsigned short OEAggregate::SetNumber(OETagID tag, unsigned long value) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || !IsValidTag(tag)) return 0;
+    switch (row->m_kind) {
+    case OEFK_ENUM:
+        if (!row->m_keywords || value >= row->m_keywords->m_count) return 0;
+        *static_cast<unsigned short*>(Slot(row)) = static_cast<unsigned short>(value);
+        break;
+    case OEFK_BOOL:
+        *static_cast<unsigned short*>(Slot(row)) = value ? 1 : 0;
+        break;
+    case OEFK_USHORT:
+        if (value > 65535) return 0;
+        *static_cast<unsigned short*>(Slot(row)) = static_cast<unsigned short>(value);
+        break;
+    case OEFK_ULONG:
+        *static_cast<unsigned long*>(Slot(row)) = value;
+        break;
+    default:
+        return 0;
+    }
+    return SetTag(tag);
+}
+
+unsigned short OEAggregate::SetSigned(OETagID tag, long value) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_SLONG || !IsValidTag(tag)) return 0;
+    *static_cast<long*>(Slot(row)) = value;
+    return SetTag(tag);
+}
+
+unsigned short OEAggregate::SetChildObj(OETagID tag, OEDataObj* child) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_CHILD) return 0;
+    OEDataObj** slot = static_cast<OEDataObj**>(Slot(row));
+    const OEAggregateDesc& d = Describe();
+    const OEFieldRow* markRow = row;
+    for (unsigned short i = 0; child && i < d.m_fieldCount; ++i) {
+        const OEFieldRow* other = &d.m_fields[i];
+        if (other->m_kind == OEFK_CHILD && Slot(other) == slot && other->m_tag == child->GetType())
+            markRow = other;
+    }
+    // A child whose tag does not apply at this version is refused; the caller keeps it.
+    if (child && !IsValidTag(markRow->m_tag)) return 0;
+    if (*slot != child) delete *slot;
+    *slot = nullptr;
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* other = &d.m_fields[i];
+        if (other->m_kind == OEFK_CHILD && Slot(other) == slot && ValidateTag(other->m_tag))
+            ClearTag(other->m_tag);
+    }
+    if (!child) return 1;
+    *slot = child;
+    if (child->GetType() == 0) child->SetType(markRow->m_tag);
+    if (GetMsgSetVersion() && !child->GetMsgSetVersion()) child->SetMsgSetVersion(GetMsgSetVersion());
+    return SetTag(markRow->m_tag);
+}
+
+OEDataObj* OEAggregate::DisconnectChildObj(OETagID tag) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_CHILD) return nullptr;
+    OEDataObj** slot = static_cast<OEDataObj**>(Slot(row));
+    OEDataObj* child = *slot;
+    if (!child) return nullptr;
+    *slot = nullptr;
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* other = &d.m_fields[i];
+        if (other->m_kind == OEFK_CHILD && Slot(other) == slot && ValidateTag(other->m_tag))
+            ClearTag(other->m_tag);
+    }
+    return child;
+}
+
+unsigned short OEAggregate::AppendToList(OETagID tag, OEDataObj* element) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_LIST || !element) return 0;
+    if (!static_cast<OEDataObjList*>(Slot(row))->Append(element)) return 0;
+    if (element->GetType() == 0) element->SetType(tag);
+    if (GetMsgSetVersion() && !element->GetMsgSetVersion()) element->SetMsgSetVersion(GetMsgSetVersion());
+    SetTag(tag);
+    return 1;
+}
+
+const OEString* OEAggregate::GetText(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_TEXT || !ValidateTag(tag)) return nullptr;
+    return static_cast<const OEString*>(Slot(row));
+}
+
+const OEPrecisionInteger* OEAggregate::GetAmount(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_AMOUNT || !ValidateTag(tag)) return nullptr;
+    return static_cast<const OEPrecisionInteger*>(Slot(row));
+}
+
+const OEDateTime* OEAggregate::GetDateTime(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_DATETIME || !ValidateTag(tag)) return nullptr;
+    return static_cast<const OEDateTime*>(Slot(row));
+}
+
+unsigned long OEAggregate::GetNumber(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || !ValidateTag(tag)) return 0;
+    switch (row->m_kind) {
+    case OEFK_ENUM:
+    case OEFK_BOOL:
+    case OEFK_USHORT:
+        return *static_cast<const unsigned short*>(Slot(row));
+    case OEFK_ULONG:
+        return *static_cast<const unsigned long*>(Slot(row));
+    default:
+        return 0;
+    }
+}
+
+long OEAggregate::GetSigned(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_SLONG || !ValidateTag(tag)) return 0;
+    return *static_cast<const long*>(Slot(row));
+}
+
+OEDataObj* OEAggregate::GetChildObj(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_CHILD) return nullptr;
+    OEDataObj* child = *static_cast<OEDataObj**>(Slot(row));
+    return child && child->GetType() == tag ? child : nullptr;
+}
+
+OEDataObjList* OEAggregate::GetList(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_LIST) return nullptr;
+    return static_cast<OEDataObjList*>(Slot(row));
+}
+
+OEBuildStatus OEAggregate::Fail(OEBuilder* builder, OEBuildStatus status) {
+    if (status != OEBS_OK) builder->SetFailedObject(this);
+    return status;
+}
+
+OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
+    if (row->m_kind != OEFK_LIST && !ValidateTag(row->m_tag)) return OEBS_OK;
+    return BuildPresentRow(builder, row);
+}
+
+OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow* row) {
+    OETagID tag = row->m_tag;
+    void* slot = Slot(row);
+    OEBuildStatus status = OEBS_OK;
+    switch (row->m_kind) {
+    case OEFK_CHILD: {
+        OEDataObj* child = *static_cast<OEDataObj**>(slot);
+        if (!child || child->GetType() != tag) return OEBS_OK;
+        return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
+    }
+    case OEFK_LIST: {
+        OEDataObjList* list = static_cast<OEDataObjList*>(slot);
+        for (unsigned short i = 0; i < list->Entries(); ++i) {
+            OEDataObj* child = list->Get(i);
+            if (!child) continue;
+            status = static_cast<OEBuildStatus>(child->BuildObject(builder, tag));
+            if (status != OEBS_OK) return Fail(builder, status);
+        }
+        return OEBS_OK;
+    }
+    default:
+        break;
+    }
+    switch (row->m_kind) {
+    case OEFK_TEXT:
+        status = builder->AddTagOEString(tag, *static_cast<const OEString*>(slot));
+        break;
+    case OEFK_AMOUNT:
+        status = builder->AddTagOEAmount(tag, *static_cast<const OEPrecisionInteger*>(slot));
+        break;
+    case OEFK_DATETIME:
+        status = builder->AddTagOEDateTime(tag, *static_cast<const OEDateTime*>(slot));
+        break;
+    case OEFK_ENUM: {
+        unsigned short value = *static_cast<const unsigned short*>(slot);
+        if (!row->m_keywords || value >= row->m_keywords->m_count) return Fail(builder, OEBS_NOTEXTFORM);
+        status = builder->AddTagOEKeyword(tag, row->m_keywords->m_words[value]);
+        break;
+    }
+    case OEFK_BOOL:
+        status = builder->AddTagOEBoolean(tag, *static_cast<const unsigned short*>(slot));
+        break;
+    case OEFK_USHORT:
+        status = builder->AddTagOEUShort(tag, *static_cast<const unsigned short*>(slot));
+        break;
+    case OEFK_ULONG:
+        status = builder->AddTagOEULong(tag, *static_cast<const unsigned long*>(slot));
+        break;
+    case OEFK_SLONG:
+        status = builder->AddTagOESLong(tag, *static_cast<const long*>(slot));
+        break;
+    case OEFK_TEXTLIST: {
+        const OEDynamicArrayString* list = static_cast<const OEDynamicArrayString*>(slot);
+        for (unsigned short i = 0; i < list->Entries() && status == OEBS_OK; ++i)
+            status = builder->AddTagOEString(tag, list->GetString(i));
+        break;
+    }
+    default:
+        break;
+    }
+    return Fail(builder, status);
+}
+
+int OEAggregate::Build(OEBuilder* builder) {
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* row = &d.m_fields[i];
+        // Absent rows are skipped here, by their presence bit, before any other work.
+        if (row->m_kind != OEFK_LIST && !RowPresent(i)) continue;
+        OEBuildStatus status = BuildPresentRow(builder, row);
+        if (status != OEBS_OK) return status;
+    }
+    return OEBS_OK;
+}
+
+OEDataObj* OEAggregate::GetChild(unsigned short index) const {
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* row = &d.m_fields[i];
+        if (row->m_kind == OEFK_CHILD) {
+            OEDataObj* child = *static_cast<OEDataObj**>(Slot(row));
+            if (!child || child->GetType() != row->m_tag) continue;
+            if (index == 0) return child;
+            --index;
+        } else if (row->m_kind == OEFK_LIST) {
+            OEDataObjList* list = static_cast<OEDataObjList*>(Slot(row));
+            if (index < list->Entries()) return list->Get(index);
+            index = static_cast<unsigned short>(index - list->Entries());
+        }
+    }
+    return nullptr;
+}
+
+unsigned short OEAggregate::GetNumberOfChildren() const {
+    const OEAggregateDesc& d = Describe();
+    unsigned short n = 0;
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* row = &d.m_fields[i];
+        if (row->m_kind == OEFK_CHILD) {
+            OEDataObj* child = *static_cast<OEDataObj**>(Slot(row));
+            if (child && child->GetType() == row->m_tag) ++n;
+        } else if (row->m_kind == OEFK_LIST) {
+            n = static_cast<unsigned short>(n + static_cast<OEDataObjList*>(Slot(row))->Entries());
+        }
+    }
+    return n;
+}
+
+unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
+    if (!other || other == this) return other ? 1 : 0;
+    const OEAggregateDesc& d = Describe();
+    if (&other->Describe() != &d) return 0;
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return 0;
+    DeleteChildren();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        const OEFieldRow* row = &d.m_fields[i];
+        void* to = Slot(row);
+        const void* from = other->Slot(row);
+        switch (row->m_kind) {
+        case OEFK_TEXT:
+            *static_cast<OEString*>(to) = *static_cast<const OEString*>(from);
+            break;
+        case OEFK_AMOUNT:
+            *static_cast<OEPrecisionInteger*>(to) = *static_cast<const OEPrecisionInteger*>(from);
+            break;
+        case OEFK_DATETIME:
+            *static_cast<OEDateTime*>(to) = *static_cast<const OEDateTime*>(from);
+            break;
+        case OEFK_ENUM:
+        case OEFK_BOOL:
+        case OEFK_USHORT:
+            *static_cast<unsigned short*>(to) = *static_cast<const unsigned short*>(from);
+            break;
+        case OEFK_ULONG:
+            *static_cast<unsigned long*>(to) = *static_cast<const unsigned long*>(from);
+            break;
+        case OEFK_SLONG:
+            *static_cast<long*>(to) = *static_cast<const long*>(from);
+            break;
+        case OEFK_TEXTLIST:
+            static_cast<OEDynamicArrayString*>(to)->DeleteAll();
+            if (!static_cast<OEDynamicArrayString*>(to)->DeepCopyFrom(
+                    *static_cast<const OEDynamicArrayString*>(from)))
+                return 0;
+            break;
+        case OEFK_CHILD: {
+            OEDataObj* src = *static_cast<OEDataObj* const*>(from);
+            if (!src || src->GetType() != row->m_tag) break;
+            OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, src->GetMsgSetVersion()));
+            if (!copy) return 0;
+            *static_cast<OEDataObj**>(to) = copy;
+            if (!copy->DeepCopyFrom(static_cast<const OEAggregate*>(src))) return 0;
+            break;
+        }
+        case OEFK_LIST: {
+            const OEDataObjList* src = static_cast<const OEDataObjList*>(from);
+            OEDataObjList* dst = static_cast<OEDataObjList*>(to);
+            for (unsigned short k = 0; k < src->Entries(); ++k) {
+                const OEAggregate* e = static_cast<const OEAggregate*>(src->Get(k));
+                if (!e) continue;
+                OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, e->GetMsgSetVersion()));
+                if (!copy) return 0;
+                if (!dst->Append(copy)) {
+                    delete copy;
+                    return 0;
+                }
+                if (!copy->DeepCopyFrom(e)) return 0;
+            }
+            break;
+        }
+        }
+    }
+    if (!CopyExtraFrom(other)) return 0;
+    return CopyBaseMembersFrom(other);
+}
+
+unsigned short OEAggregate::CopyExtraFrom(const OEAggregate*) {
+    return 1;
+}
+
+OEDynamicArrayString* OEAggregate::GetTextList(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_TEXTLIST) return nullptr;
+    return static_cast<OEDynamicArrayString*>(Slot(row));
+}
+
+unsigned short OEAggregate::AppendText(OETagID tag, const OEString& value) {
+    OEDynamicArrayString* list = GetTextList(tag);
+    if (!list || !IsValidTag(tag)) return 0;
+    if (!list->AddString(value)) return 3;
+    if (value.ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, value.c_str(), "", tag, this);
+    return SetTag(tag);
+}
+
+void OEAggregate::AmountText(const OEPrecisionInteger& value, OEString& out) {
+    OEPrecisionInteger copy(value);
+    unsigned short scale = copy.Decimal();
+    const char* plain = static_cast<char*>(copy); // trailing zeros dropped
+    std::string text = plain ? plain : "0";
+    bool negative = !text.empty() && text[0] == '-';
+    std::string digits = negative ? text.substr(1) : text;
+    if (!digits.empty() && digits[0] == '.') digits.insert(0, "0");
+    if (scale > 0 && scale < 30) {
+        size_t point = digits.find('.');
+        size_t have = point == std::string::npos ? 0 : digits.size() - point - 1;
+        if (point == std::string::npos) digits += '.';
+        while (have < scale) {
+            digits += '0';
+            ++have;
+        }
+    }
+    out = ((negative ? "-" : "") + digits).c_str();
+}
+
+unsigned short OEAggregate::GetFieldText(const OEFieldRow* row, OEString& out) const {
+    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST || !ValidateTag(row->m_tag)) return 0;
+    const void* slot = Slot(row);
+    char number[32];
+    switch (row->m_kind) {
+    case OEFK_TEXT:
+        out = *static_cast<const OEString*>(slot);
+        return 1;
+    case OEFK_AMOUNT:
+        AmountText(*static_cast<const OEPrecisionInteger*>(slot), out);
+        return 1;
+    case OEFK_DATETIME:
+        if (!static_cast<const OEDateTime*>(slot)->GetDateString(out)) out = "";
+        return 1;
+    case OEFK_ENUM: {
+        unsigned short v = *static_cast<const unsigned short*>(slot);
+        out = row->m_keywords && v < row->m_keywords->m_count ? row->m_keywords->m_words[v] : "?";
+        return 1;
+    }
+    case OEFK_BOOL:
+        out = *static_cast<const unsigned short*>(slot) ? "Y" : "N";
+        return 1;
+    case OEFK_TEXTLIST: {
+        const OEDynamicArrayString* list = static_cast<const OEDynamicArrayString*>(slot);
+        std::string joined;
+        for (unsigned short i = 0; i < list->Entries(); ++i)
+            joined += (i ? ", " : "") + std::string(list->GetString(i)->c_str());
+        out = joined.c_str();
+        return 1;
+    }
+    case OEFK_USHORT:
+        std::snprintf(number, sizeof(number), "%u",
+                      static_cast<unsigned>(*static_cast<const unsigned short*>(slot)));
+        break;
+    case OEFK_ULONG:
+        std::snprintf(number, sizeof(number), "%lu", *static_cast<const unsigned long*>(slot));
+        break;
+    case OEFK_SLONG:
+        std::snprintf(number, sizeof(number), "%ld", *static_cast<const long*>(slot));
+        break;
+    default:
+        return 0;
+    }
+    out = number;
+    return 1;
+}

@@ -1,0 +1,186 @@
+// The aggregate machinery: one descriptor table per aggregate class, one generic implementation.
+//
+// An aggregate class says what it is once, as data: its own tag, its valid and required child
+// tables (OEArrayOfTags rows with version masks) and its field rows in build order. Each field row
+// names a child tag, the kind of value stored for it and where that value lives in the object.
+// OEAggregate derives from the rows everything the data-object protocol asks for: element
+// dispatch (HandleTagElement), child creation (HandleTagStart), Build, DeepCopyFrom, the child walk
+// (GetChild / GetNumberOfChildren) and the typed set/get helpers behind the named accessors.
+//
+// What data cannot say (an exclusive-or of presence marks, the sign-on credentials rule, a
+// setter that deletes before it marks) is written by hand as an override in the class's own
+// file. docs/aggregates.md shows how to add a class.
+#ifndef OESDK_MESSAGES_OEAGGREGATE_H
+#define OESDK_MESSAGES_OEAGGREGATE_H
+#include "oeexport.h"
+#include "foundation/oedynarr.h"
+#include "foundation/oestring.h"
+#include "foundation/oeprecision.h"
+#include "foundation/oedatetime.h"
+#include "tags/oedataobj.h"
+#include "tags/oedatafactory.h"
+
+#include <atomic>
+
+class OEBuilder;
+
+// What a field row stores.
+enum OEFieldKind : unsigned char {
+    OEFK_TEXT = 0, // an OEString (or a bounded subclass: its spec length is the bound)
+    OEFK_AMOUNT,   // an OEPrecisionInteger
+    OEFK_DATETIME, // an OEDateTime
+    OEFK_ENUM,     // an unsigned short index into the row's keyword table
+    OEFK_BOOL,     // an unsigned short flag written "Y" / "N"
+    OEFK_USHORT,   // an unsigned short number
+    OEFK_SLONG,    // a long
+    OEFK_ULONG,    // an unsigned long
+    OEFK_CHILD,    // one owned child aggregate (OEOwnedChild); rows may share one slot
+    OEFK_LIST,     // an owned, ordered list of child aggregates (OEPtrArray<OEDataObj>)
+    OEFK_TEXTLIST  // a repeated element: an OEDynamicArrayString, one element per entry
+};
+
+// A keyword table of an enumeration: keyword i is value i.
+struct OEKeywordTable {
+    const char* const* m_words;
+    unsigned short m_count;
+};
+
+// One field row. `m_member` hands out the address of the value inside a given object; a captureless
+// lambda does the cast (see OE_FIELD in docs/aggregates.md). `m_make` creates a child through the
+// factory (child and list rows only).
+struct OEFieldRow {
+    OETagID m_tag;
+    OEFieldKind m_kind;
+    void* (*m_member)(OEDataObj* object);
+    const OEKeywordTable* m_keywords;
+    OEDataObj* (*m_make)(OEDataObjFactory* factory, unsigned short version);
+};
+
+// The descriptor of one aggregate class.
+struct OEAggregateDesc {
+    OETagID m_type;
+    const OETagRow* m_valid;
+    unsigned short m_validCount;
+    const OETagRow* m_required;
+    unsigned short m_requiredCount;
+    const OEFieldRow* m_fields; // in build order
+    unsigned short m_fieldCount;
+    // Filled on first use: for each field row, the position of its tag in the valid table (its
+    // presence bit), or 0xFF. Lets Build test presence without searching the table per row.
+    mutable std::atomic<const unsigned char*> m_bits{nullptr};
+    const unsigned char* Bits() const;
+};
+
+// Address of a member of class C, as an OEFieldRow wants it.
+#define OE_MEMBER(C, m) [](OEDataObj* o) -> void* { return &static_cast<C*>(o)->m; }
+// A creator that asks the factory for a new object, as an OEFieldRow wants it.
+#define OE_MAKE(op) [](OEDataObjFactory* f, unsigned short v) -> OEDataObj* { return f->op(v); }
+// A descriptor over the class's static tables (valid, required, fields).
+#define OE_DESC(tag, valid, required, fields)                                                                \
+    OEAggregateDesc {                                                                                        \
+        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), required,                 \
+            static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields,                     \
+            static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
+    }
+
+typedef OEPtrArray<OEDataObj> OEDataObjList;
+
+// The storage of a child row: one owned child, deleted with the member. (Standard layout with the
+// pointer first, so the slot's address is also the address of the pointer.)
+struct OE_API OEOwnedChild {
+    OEDataObj* m_obj = nullptr;
+    OEOwnedChild() = default;
+    ~OEOwnedChild();
+    OEOwnedChild(const OEOwnedChild&) = delete;
+    OEOwnedChild& operator=(const OEOwnedChild&) = delete;
+    OEDataObj* get() const { return m_obj; }
+};
+
+class OE_API OEAggregate : public OEDataObj {
+public:
+    explicit OEAggregate(unsigned short version = 0);
+    ~OEAggregate() override;
+    OEAggregate(const OEAggregate&) = delete;
+    OEAggregate& operator=(const OEAggregate&) = delete;
+
+    // The class's descriptor.
+    virtual const OEAggregateDesc& Describe() const = 0;
+
+    unsigned short GetArrayOfValidTags(OEArrayOfTags& tags) const override;
+    unsigned short GetArrayOfRequiredTags(OEArrayOfTags& tags) const override;
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
+    using OEDataObj::HandleTagElement;
+    int Build(OEBuilder* builder) override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+
+    // Copies every field and child of `other`, which must be of the same class (children are made
+    // through the factory), then calls CopyExtraFrom. 1 on success; 0 for another class, no
+    // factory or no memory.
+    virtual unsigned short DeepCopyFrom(const OEAggregate* other);
+    // Hook: members that no field row describes (a hand-written list, say). Base: 1.
+    virtual unsigned short CopyExtraFrom(const OEAggregate* other);
+
+    // The text form of a present element row (as the builder writes it, before escaping): 1, or
+    // 0 for a child row or an element that is not present. For tools that show a tree.
+    unsigned short GetFieldText(const OEFieldRow* row, OEString& out) const;
+    // An exact decimal as written with its own scale (trailing zeros kept, a zero before the
+    // point): -25.00 stays "-25.00", .5 becomes "0.5".
+    static void AmountText(const OEPrecisionInteger& value, OEString& out);
+
+protected:
+    // The row for a tag, or null.
+    const OEFieldRow* FindRow(OETagID tag) const;
+    // Where a row's value lives in this object.
+    void* Slot(const OEFieldRow* row) const { return row->m_member(const_cast<OEAggregate*>(this)); }
+
+    // Typed setters behind the named accessors: store, mark the tag and return 1; 0 when the tag
+    // does not apply at this version. The text form converts first: a refused value is logged
+    // (OEPW_BADFORMAT with the tag) and leaves the mark clear.
+    unsigned short SetFromText(OETagID tag, const OEString& text);
+    unsigned short SetText(OETagID tag, const OEString& value);
+    unsigned short SetAmount(OETagID tag, const OEPrecisionInteger& value);
+    unsigned short SetDateTime(OETagID tag, const OEDateTime& value);
+    unsigned short SetNumber(OETagID tag, unsigned long value); // enum, bool, ushort, ulong
+    unsigned short SetSigned(OETagID tag, long value);
+    // Replaces the object in a child slot (the old one is deleted, the marks of every row that
+    // shares the slot are cleared). A null child only clears. The new child is marked under its
+    // own type when that is one of the slot's tags, else under `tag`.
+    unsigned short SetChildObj(OETagID tag, OEDataObj* child);
+    // Hands the child in a slot back to the caller (not deleted), clearing its marks.
+    OEDataObj* DisconnectChildObj(OETagID tag);
+    // Appends to a list row and marks it; the list owns the element afterwards.
+    unsigned short AppendToList(OETagID tag, OEDataObj* element);
+
+    // Typed getters: the stored value, or null when the tag is not marked.
+    const OEString* GetText(OETagID tag) const;
+    const OEPrecisionInteger* GetAmount(OETagID tag) const;
+    const OEDateTime* GetDateTime(OETagID tag) const;
+    unsigned long GetNumber(OETagID tag) const; // 0 when not marked
+    long GetSigned(OETagID tag) const;
+    OEDataObj* GetChildObj(OETagID tag) const;
+    OEDataObjList* GetList(OETagID tag) const;
+    OEDynamicArrayString* GetTextList(OETagID tag) const;
+    // Appends one entry to a repeated element and marks it.
+    unsigned short AppendText(OETagID tag, const OEString& value);
+
+    // Builds one row (element or child) when it is present; the generic Build calls it per row.
+    // Subclasses that write something in between override Build and call this.
+    OEBuildStatus BuildRow(OEBuilder* builder, const OEFieldRow* row);
+    // The same for a row already known to be present.
+    OEBuildStatus BuildPresentRow(OEBuilder* builder, const OEFieldRow* row);
+    // 1 when field row `index` of this class is present (the same answer as ValidateTag).
+    unsigned short RowPresent(unsigned short index) const;
+    // 1 when the tag of field row `index` applies at this object's version (as IsValidTag).
+    unsigned short RowApplies(unsigned short index) const;
+    // Records this object as the failed one (if none is yet) and returns the status.
+    OEBuildStatus Fail(OEBuilder* builder, OEBuildStatus status);
+    // Creates a child for a start tag through the factory and pushes it (the protocol of
+    // HandleTagStart for child and list rows).
+    OEParseStatus StartChild(const OEFieldRow* row, const OETagDictionaryEntry* entry);
+    // Deletes every child and list element.
+    void DeleteChildren();
+};
+
+#endif

@@ -1,0 +1,125 @@
+// The factory operations of the file layer and the message classes. They live here, beside the
+// classes, so that the tags layer needs only their names.
+#include "tags/oedatafactory.h"
+
+#include "file/oefile.h"
+#include "foundation/oelanguage.h"
+#include "messages/oebank.h"
+#include "messages/oecurrency.h"
+#include "messages/oemsgset.h"
+#include "messages/oeprofile.h"
+
+OEFile* OEDataObjFactory::NewFile(unsigned short version) {
+    return Create<OEFile>(version);
+}
+OEFileRq* OEDataObjFactory::NewFileRq(unsigned short version) {
+    return Create<OEFileRq>(version);
+}
+OEFileRs* OEDataObjFactory::NewFileRs(unsigned short version) {
+    return Create<OEFileRs>(version);
+}
+OECurrency* OEDataObjFactory::NewCurrency(unsigned short version) {
+    return Create<OECurrency>(version);
+}
+OERequest* OEDataObjFactory::NewRequest(unsigned short version) {
+    return Create<OERequest>(version);
+}
+OEResponse* OEDataObjFactory::NewResponse(unsigned short version) {
+    return Create<OEResponse>(version);
+}
+OEMessageSetRs* OEDataObjFactory::NewMessageSetRs(unsigned short version) {
+    return Create<OEMessageSetRs>(version);
+}
+OEMessageSetRq* OEDataObjFactory::NewMessageSetRq(unsigned short version) {
+    return Create<OEMessageSetRq>(version);
+}
+OESyncRq* OEDataObjFactory::NewSyncRq(unsigned short version) {
+    return Create<OESyncRq>(version);
+}
+OESyncRs* OEDataObjFactory::NewSyncRs(unsigned short version) {
+    return Create<OESyncRs>(version);
+}
+OETransRq* OEDataObjFactory::NewTransRq(unsigned short version) {
+    return Create<OETransRq>(version);
+}
+OELanguage* OEDataObjFactory::NewLanguage(unsigned short version) {
+    return Create<OELanguage>(version);
+}
+OEStatus* OEDataObjFactory::NewStatus(unsigned short version) {
+    return Create<OEStatus>(version);
+}
+OETransRs* OEDataObjFactory::NewTransRs(unsigned short version) {
+    return Create<OETransRs>(version);
+}
+OESignOnRs* OEDataObjFactory::NewSignOnRs(unsigned short version) {
+    return Create<OESignOnRs>(version);
+}
+OESignOnRq* OEDataObjFactory::NewSignOnRq(unsigned short version) {
+    return Create<OESignOnRq>(version);
+}
+OEFI* OEDataObjFactory::NewFI(unsigned short version) {
+    return Create<OEFI>(version);
+}
+OEPinChangeRq* OEDataObjFactory::NewPinChangeRq(unsigned short version) {
+    return Create<OEPinChangeRq>(version);
+}
+OEPinChangeRs* OEDataObjFactory::NewPinChangeRs(unsigned short version) {
+    return Create<OEPinChangeRs>(version);
+}
+OEBalance* OEDataObjFactory::NewBalance(unsigned short version) {
+    return Create<OEBalance>(version);
+}
+OEBankAccount* OEDataObjFactory::NewBankAccount(unsigned short version) {
+    return Create<OEBankAccount>(version);
+}
+OEBankStatementRs* OEDataObjFactory::NewBankStatementRs(unsigned short version) {
+    return Create<OEBankStatementRs>(version);
+}
+OEBankStatementRq* OEDataObjFactory::NewBankStatementRq(unsigned short version) {
+    return Create<OEBankStatementRq>(version);
+}
+OEBankStatementTx* OEDataObjFactory::NewBankStatementTx(unsigned short version) {
+    return Create<OEBankStatementTx>(version);
+}
+OEIncTransaction* OEDataObjFactory::NewIncTransaction(unsigned short version) {
+    return Create<OEIncTransaction>(version);
+}
+OELedgerBalance* OEDataObjFactory::NewLedgerBalance(unsigned short version) {
+    return Create<OELedgerBalance>(version);
+}
+OEAvailableBalance* OEDataObjFactory::NewAvailableBalance(unsigned short version) {
+    return Create<OEAvailableBalance>(version);
+}
+OEBankTransactionList* OEDataObjFactory::NewBankTransactionList(unsigned short version) {
+    return Create<OEBankTransactionList>(version);
+}
+OECCAccount* OEDataObjFactory::NewCCAccount(unsigned short version) {
+    return Create<OECCAccount>(version);
+}
+OECCStatementRs* OEDataObjFactory::NewCCStatementRs(unsigned short version) {
+    return Create<OECCStatementRs>(version);
+}
+OECCStatementRq* OEDataObjFactory::NewCCStatementRq(unsigned short version) {
+    return Create<OECCStatementRq>(version);
+}
+OEPayee* OEDataObjFactory::NewPayee(unsigned short version) {
+    return Create<OEPayee>(version);
+}
+OEPayee2* OEDataObjFactory::NewPayee2(unsigned short version) {
+    return Create<OEPayee2>(version);
+}
+OEWarning* OEDataObjFactory::NewWarning(unsigned short version) {
+    return Create<OEWarning>(version);
+}
+OEMessageSetCore* OEDataObjFactory::NewMessageSetCore(unsigned short version) {
+    return Create<OEMessageSetCore>(version);
+}
+OEMessageSetVersion* OEDataObjFactory::NewMessageSetVersion(unsigned short version) {
+    return Create<OEMessageSetVersion>(version);
+}
+OEMessageSetProfile* OEDataObjFactory::NewMessageSetProfile(unsigned short version) {
+    return Create<OEMessageSetProfile>(version);
+}
+OEMessageSetList* OEDataObjFactory::NewMessageSetList(unsigned short version) {
+    return Create<OEMessageSetList>(version);
+}

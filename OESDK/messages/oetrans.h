@@ -1,0 +1,250 @@
+// Transaction wrappers (...TRNRQ / ...TRNRS), STATUS, WARNING and the synchronisation wrappers
+// (...SYNCRQ / ...SYNCRS).
+#ifndef OESDK_MESSAGES_OETRANS_H
+#define OESDK_MESSAGES_OETRANS_H
+#include "messages/oeaggregate.h"
+#include "foundation/oeenums.h"
+
+// The base of the wrappers and of every inner request and response aggregate.
+class OE_API OETransBase : public OEAggregate {
+public:
+    explicit OETransBase(unsigned short version = 0) : OEAggregate(version) {}
+};
+
+// A severity outside the list: the initial "not set" value of a status.
+const unsigned short OESEV_NOTSET = 3;
+
+// STATUS: CODE, SEVERITY, MESSAGE (version 1), MESSAGE2 (versions 2 and up).
+class OE_API OEStatus : public OEAggregate {
+public:
+    explicit OEStatus(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    long GetCode() const { return m_code; }
+    // Text form: malformed text logs OEPW_BADFORMAT; a number outside -99999..999999 logs
+    // OEPW_TOOLONG (that code, deliberately). Either way CODE stays unset and the result is 0.
+    unsigned short SetCode(const OEString& text);
+    unsigned short SetCode(long code);
+    OEStatusSeverity GetSeverity() const { return static_cast<OEStatusSeverity>(m_severity); }
+    // "INFO", "WARN", "ERROR" ignoring case. Any other word logs OEPW_BADFORMAT twice: once as the
+    // conversion's own report (no tag) and once against SEVERITY.
+    unsigned short SetSeverity(const OEString& text);
+    unsigned short SetSeverity(OEStatusSeverity severity);
+    const OEString* GetMessageText() const { return GetText(OETAG_MESSAGE); }
+    unsigned short SetMessageText(const OEString& v) { return SetFromText(OETAG_MESSAGE, v); }
+    const OEString* GetMessage2Text() const { return GetText(OETAG_MESSAGE2); }
+    unsigned short SetMessage2Text(const OEString& v) { return SetFromText(OETAG_MESSAGE2, v); }
+    OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
+    using OEAggregate::HandleTagElement;
+
+    long m_code = 0;
+    unsigned short m_severity = OESEV_NOTSET;
+    OEString255 m_message;
+    OEString2000 m_message2;
+};
+
+// WARNING: TITLE and MSG, both required.
+class OE_API OEWarning : public OEAggregate {
+public:
+    explicit OEWarning(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    const OEString* GetMsgTitle() const { return GetText(OETAG_TITLE); }
+    unsigned short SetMsgTitle(const OEString& v) { return SetFromText(OETAG_TITLE, v); }
+    const OEString* GetMsgBody() const { return GetText(OETAG_MSG); }
+    unsigned short SetMsgBody(const OEString& v) { return SetFromText(OETAG_MSG, v); }
+
+    OEString m_title, m_msg;
+};
+
+// Every transaction request wrapper; its own tag says which one.
+class OE_API OETransRq : public OETransBase {
+public:
+    explicit OETransRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
+    // Replaces the inner request (the old one is deleted) and marks its tag.
+    unsigned short SetActualTrans(OETransBase* inner);
+    const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
+    unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
+    const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
+    unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
+    const OEString* GetTAN() const { return GetText(OETAG_TAN); }
+    unsigned short SetTAN(const OEString& v) { return SetFromText(OETAG_TAN, v); }
+    unsigned short GetSyncCompleteInfo() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_SYNCCOMPLETEINFO));
+    }
+    unsigned short SetSyncCompleteInfo(const OEString& v) { return SetFromText(OETAG_SYNCCOMPLETEINFO, v); }
+    unsigned short SetSyncCompleteInfo(unsigned short v) { return SetNumber(OETAG_SYNCCOMPLETEINFO, v); }
+    OETagID GetMsgsRqTag() const { return m_msgsTag; }
+    void SetMsgsRqTag(OETagID tag) { m_msgsTag = tag; }
+    // Inner request tag to its wrapper tag (STMTRQ gives STMTTRNRQ); 0 for any other tag.
+    static OETagID MsgIDToTranWrapper(OETagID tag);
+
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    unsigned short AllRequiredPresent() override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransRq*>(other)->m_msgsTag;
+        return 1;
+    }
+
+    OEOwnedChild m_actual;
+    OEString36 m_trnUid;
+    unsigned short m_syncCompleteInfo = 0;
+    OEString255 m_cltCookie;
+    OEBoundedString<80> m_tan;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // Creates the inner request for a start tag as the actual transaction: 3 without a factory
+    // or memory, 4 for a tag without a class (yet); K.EFILERQ succeeds only when one is held.
+    OEParseStatus NewRq(OETagID tag);
+};
+
+// Every transaction response wrapper.
+class OE_API OETransRs : public OETransBase {
+public:
+    explicit OETransRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
+    unsigned short SetActualTrans(OETransBase* inner);
+    // Hands the inner response to the caller (not deleted).
+    OETransBase* DisconnectActualTrans();
+    OEStatus* GetStatus() const { return static_cast<OEStatus*>(m_status.get()); }
+    unsigned short SetStatus(OEStatus* status) { return SetChildObj(OETAG_STATUS, status); }
+    OEWarning* GetWarning() const { return static_cast<OEWarning*>(m_warning.get()); }
+    unsigned short SetWarning(OEWarning* warning) { return SetChildObj(OETAG_WARNING, warning); }
+    const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
+    unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
+    const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
+    unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
+    OETagID GetMsgsRsTag() const { return m_msgsTag; }
+    void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
+    // STATUS present with SEVERITY ERROR.
+    unsigned short IsErrorStatus() const;
+    // STATUS present with CODE 1 (the client is up to date).
+    unsigned short IsUpToDate() const;
+
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    unsigned short AllRequiredPresent() override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransRs*>(other)->m_msgsTag;
+        return 1;
+    }
+
+    OEOwnedChild m_actual, m_status, m_warning;
+    OEString36 m_trnUid;
+    OEString255 m_cltCookie;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // Creates the inner response for a start tag (the mirror of OETransRq::NewRq).
+    OEParseStatus NewRs(OETagID tag);
+};
+
+// Every synchronisation request (...SYNCRQ).
+class OE_API OESyncRq : public OEAggregate {
+public:
+    explicit OESyncRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
+    unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
+    const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
+    unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
+    unsigned short GetTokenOnly() const { return static_cast<unsigned short>(GetNumber(OETAG_TOKENONLY)); }
+    unsigned short SetTokenOnly(unsigned short v) { return SetNumber(OETAG_TOKENONLY, v); }
+    unsigned short GetRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_REFRESH)); }
+    unsigned short SetRefresh(unsigned short v) { return SetNumber(OETAG_REFRESH, v); }
+    unsigned short GetRejectIfMissing() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_REJECTIFMISSING));
+    }
+    unsigned short SetRejectIfMissing(unsigned short v) { return SetNumber(OETAG_REJECTIFMISSING, v); }
+    unsigned short GetIncludeImages() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_INCIMAGES));
+    }
+    unsigned short SetIncludeImages(unsigned short v) { return SetNumber(OETAG_INCIMAGES, v); }
+    unsigned short GetUseHTML() const { return static_cast<unsigned short>(GetNumber(OETAG_USEHTML)); }
+    unsigned short SetUseHTML(unsigned short v) { return SetNumber(OETAG_USEHTML, v); }
+    unsigned long GetSyncError() const { return GetNumber(OETAG_SYNCERROR); }
+    unsigned short SetSyncError(unsigned long v) { return SetNumber(OETAG_SYNCERROR, v); }
+    unsigned short GetKestRefresh() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_KEST_REFRESH));
+    }
+    unsigned short SetKestRefresh(unsigned short v) { return SetNumber(OETAG_KEST_REFRESH, v); }
+    unsigned short SetKestSyncError(unsigned long v) { return SetNumber(OETAG_KEST_SYNCERROR, v); }
+    OEDataObj* GetAccount() const { return m_account.get(); }
+    // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
+    unsigned short SetAccount(OEDataObj* account);
+    unsigned short AppendTrans(OETransRq* trans);
+    unsigned short SetTrans(unsigned short index, OETransRq* trans);
+    OETransRq* GetTrans(unsigned short index) const { return static_cast<OETransRq*>(m_trans.Get(index)); }
+    unsigned short GetNumTrans() const { return m_trans.Entries(); }
+    void DeleteAllTrans() { m_trans.DeleteAll(); }
+    OETagID GetMsgsRqTag() const { return m_msgsTag; }
+    void SetMsgsRqTag(OETagID tag) { m_msgsTag = tag; }
+    // Inner request tag to its synchronisation wrapper; 0 for any other tag.
+    static OETagID MsgIDToSyncWrapper(OETagID tag);
+
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    int Build(OEBuilder* builder) override;
+    unsigned short AllRequiredPresent() override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
+
+    OEString m_token, m_token2;
+    unsigned short m_tokenOnly = 0, m_refresh = 0, m_rejectIfMissing = 0, m_incImages = 0, m_useHtml = 0;
+    unsigned short m_kestRefresh = 0;
+    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    OEOwnedChild m_account;
+    OEDataObjList m_trans;
+    OETagID m_msgsTag = OETAG_NONE;
+
+private:
+    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
+};
+
+// Every synchronisation response (...SYNCRS).
+class OE_API OESyncRs : public OEAggregate {
+public:
+    explicit OESyncRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
+    unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
+    const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
+    unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
+    unsigned short GetLostSync() const { return static_cast<unsigned short>(GetNumber(OETAG_LOSTSYNC)); }
+    unsigned short SetLostSync(unsigned short v) { return SetNumber(OETAG_LOSTSYNC, v); }
+    const OEString* GetTranUID() const { return GetText(OETAG_TRNUID); }
+    unsigned short SetTranUID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
+    OEDataObj* GetAccount() const { return m_account.get(); }
+    unsigned short SetAccount(OEDataObj* account);
+    unsigned short AppendTrans(OETransRs* trans);
+    OETransRs* GetTrans(unsigned short index) const { return static_cast<OETransRs*>(m_trans.Get(index)); }
+    unsigned short GetNumTrans() const { return m_trans.Entries(); }
+    void DeleteAllTrans() { m_trans.DeleteAll(); }
+    OETagID GetMsgsRsTag() const { return m_msgsTag; }
+    void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
+
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    int Build(OEBuilder* builder) override;
+    unsigned short AllRequiredPresent() override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
+
+    OEString m_token, m_token2;
+    unsigned short m_lostSync = 0, m_kestRefresh = 0;
+    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    OEString36 m_trnUid;
+    OEOwnedChild m_account;
+    OEDataObjList m_trans;
+    OETagID m_msgsTag = OETAG_NONE;
+
+private:
+    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
+};
+
+// The response tag of a request tag (STMTRQ gives STMTRS, STMTTRNRQ gives STMTTRNRS); 0 when the
+// dictionary has none.
+OE_API OETagID OEResponseTagOf(OETagID requestTag);
+
+#endif

@@ -1,0 +1,221 @@
+// The aggregate machinery itself, through real classes: element kinds and their failures, child
+// slots shared by several tags, duplicates, copies, the child walk, a host factory, and running
+// out of memory in the middle of a parse or a build.
+#include "msg_helpers.h"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+using namespace msgtest;
+
+namespace {
+
+OEDataObjFactory* F() {
+    return OEDataObj::GetFactory();
+}
+
+const char kOneStatement[] =
+    "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n<OFX><SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</"
+    "STATUS>"
+    "<DTSERVER>20240105<LANGUAGE>ENG</SONRS></"
+    "SIGNONMSGSRSV1><CREDITCARDMSGSRSV1><CCSTMTTRNRS><TRNUID>7<STATUS>"
+    "<CODE>0<SEVERITY>INFO</STATUS><CCSTMTRS><CURDEF>EUR<CCACCTFROM><ACCTID>4111</CCACCTFROM><BANKTRANLIST>"
+    "<DTSTART>20240101<DTEND>20240131<STMTTRN><TRNTYPE>PAYMENT<DTPOSTED>20240110<TRNAMT>50<FITID>P1"
+    "<PAYEE><NAME>Shop<ADDR1>1 Road<CITY>Town<STATE>ST<POSTALCODE>123<PHONE>555</PAYEE>"
+    "<ORIGCURRENCY><CURRATE>1.0850<CURSYM>USD</ORIGCURRENCY></STMTTRN>"
+    "<STMTTRN><TRNTYPE>FEE<DTPOSTED>20240111<TRNAMT>-2.5<FITID>P2<CCACCTTO><ACCTID>9</CCACCTTO></STMTTRN>"
+    "</BANKTRANLIST><LEDGERBAL><BALAMT>-47.5<DTASOF>20240131</LEDGERBAL></CCSTMTRS></CCSTMTTRNRS>"
+    "</CREDITCARDMSGSRSV1></OFX>";
+
+unsigned short Logged(OEParseWarning code, OETagID tag) {
+    unsigned short n = 0;
+    for (unsigned short i = 0; i < LogCount(); ++i)
+        n += LogEntry(i)->GetCode() == code && LogEntry(i)->GetTag() == tag;
+    return n;
+}
+
+TEST(Machinery, ElementKindsConvertOrLogAndStayUnset) {
+    struct Row {
+        OETagID tag;
+        const char* text;
+        unsigned short marked;
+        OEParseWarning logged; // OEPW_UNKNOWNEXCEPTION: nothing expected
+    };
+    const Row rows[] = {
+        {OETAG_TRNTYPE, "Pos", 1, OEPW_UNKNOWNEXCEPTION}, // keywords ignore case
+        {OETAG_TRNTYPE, "SHOPPING", 0, OEPW_BADFORMAT},
+        {OETAG_TRNAMT, "12.3x", 0, OEPW_BADFORMAT},
+        {OETAG_DTPOSTED, "2024-01-05", 0, OEPW_BADFORMAT},
+        {OETAG_CORRECTACTION, "delete", 1, OEPW_UNKNOWNEXCEPTION},
+        {OETAG_CHECKNUM, "1234567890123", 1, OEPW_TOOLONG}, // kept whole, and logged
+        {OETAG_NAME, "n", 1, OEPW_UNKNOWNEXCEPTION},
+    };
+    for (const Row& r : rows) {
+        OEParseLogger::TheOEParseLogger()->DeleteAll();
+        std::unique_ptr<OEBankStatementTx> tx(F()->NewBankStatementTx(1));
+        OETagDictionaryEntry entry{r.tag, ""};
+        EXPECT_EQ(tx->HandleTagElement(&entry, OEString(r.text)), OEPS_OK) << r.text;
+        EXPECT_EQ(tx->ValidateTag(r.tag), r.marked) << r.text;
+        if (r.logged != OEPW_UNKNOWNEXCEPTION) {
+            EXPECT_EQ(Logged(r.logged, r.tag), 1) << r.text;
+        }
+    }
+    std::unique_ptr<OEBankStatementTx> tx(F()->NewBankStatementTx(1));
+    OETagDictionaryEntry unknown{OETAG_BALAMT, "BALAMT"};
+    EXPECT_EQ(tx->HandleTagElement(&unknown, OEString("1")), OEPS_INVALID);
+    OEString whole;
+    tx->SetCheckNum(OEString("1234567890123"));
+    EXPECT_STREQ(tx->GetCheckNum()->c_str(), "1234567890123");
+
+    std::unique_ptr<OEIncTransaction> inc(F()->NewIncTransaction(1));
+    EXPECT_EQ(inc->SetInclude(OEString("yes")), 0) << "Y or N only";
+    std::unique_ptr<OESignOnRq> s(F()->NewSignOnRq(1));
+    EXPECT_EQ(s->SetAppVer(OEString("70000")), 0) << "beyond 16 bits";
+    EXPECT_EQ(s->SetAppVer(OEString("-1")), 0);
+}
+
+TEST(Machinery, SharedSlotsDuplicatesAndTheChildWalk) {
+    std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+    ASSERT_EQ(ParseInto(kOneStatement, file.get()), OEPS_OK);
+    OEMessageSetRs* set = file->GetResponse(0)->GetMessageSet(1);
+    ASSERT_NE(set, nullptr);
+    OECCStatementRs* stmt = dynamic_cast<OECCStatementRs*>(set->GetTrans(0)->GetActualTrans());
+    ASSERT_NE(stmt, nullptr);
+    OEBankStatementTx* first = stmt->GetTransactionList()->GetStatementTx(0);
+    OEBankStatementTx* second = stmt->GetTransactionList()->GetStatementTx(1);
+    ASSERT_NE(first->GetPayee(), nullptr);
+    EXPECT_STREQ(first->GetPayee()->GetCity()->c_str(), "Town");
+    ASSERT_NE(first->GetCurrency(), nullptr);
+    EXPECT_EQ(first->GetCurrency()->GetType(), OETAG_ORIGCURRENCY);
+    EXPECT_EQ(first->ValidateTag(OETAG_CURRENCY), 0);
+    EXPECT_EQ(second->GetAccountTo()->GetType(), OETAG_CCACCTTO);
+    EXPECT_EQ(stmt->GetNumberOfChildren(), 3); // account, transaction list, ledger balance
+    EXPECT_EQ(stmt->GetChild(0), stmt->GetAccountFrom());
+    EXPECT_EQ(stmt->GetChild(2), stmt->GetLedgerBalance());
+
+    // PAYEE2 shares the payee's slot but is a version-2 tag: on a version-1 transaction it is
+    // refused and nothing changes; a null payee empties the slot.
+    std::unique_ptr<OEPayee2> refused(F()->NewPayee2(2));
+    EXPECT_EQ(first->SetPayee2(refused.get()), 0);
+    EXPECT_NE(first->GetPayee(), nullptr);
+    first->SetPayee(nullptr);
+    EXPECT_EQ(first->GetPayee(), nullptr);
+    EXPECT_EQ(first->ValidateTag(OETAG_PAYEE), 0);
+    first->SetName(OEString("n"));
+    EXPECT_EQ(first->AllRequiredPresent(), 1);
+
+    // A second LEDGERBAL replaces the first and is logged.
+    std::string twice(kOneStatement);
+    twice.insert(twice.find("</CCSTMTRS>"), "<LEDGERBAL><BALAMT>1<DTASOF>20240131</LEDGERBAL>");
+    std::unique_ptr<OEFileRs> again(F()->NewFileRs(0));
+    EXPECT_EQ(ParseInto(twice, again.get()), OEPS_WARNINGS);
+    EXPECT_EQ(Logged(OEPW_EXTRAAGG, OETAG_LEDGERBAL), 1);
+    OECCStatementRs* s2 = dynamic_cast<OECCStatementRs*>(
+        again->GetResponse(0)->GetMessageSet(1)->GetTrans(0)->GetActualTrans());
+    OEString amount;
+    OEAggregate::AmountText(*s2->GetLedgerBalance()->GetBalanceAmount(), amount);
+    EXPECT_STREQ(amount.c_str(), "1");
+}
+
+TEST(Machinery, DeepCopiesAreEqualAndIndependent) {
+    std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+    ASSERT_EQ(ParseInto(kOneStatement, file.get()), OEPS_OK);
+    std::unique_ptr<OEFileRs> copy(F()->NewFileRs(0));
+    ASSERT_EQ(copy->DeepCopyFrom(file.get()), 1);
+    std::string text = BuildText(file.get());
+    EXPECT_EQ(BuildText(copy.get()), text);
+    file.reset(); // the copy owns nothing of the original
+    EXPECT_EQ(BuildText(copy.get()), text);
+
+    std::unique_ptr<OEStatus> status(F()->NewStatus(1));
+    std::unique_ptr<OEBankStatementTx> other(F()->NewBankStatementTx(1));
+    EXPECT_EQ(other->DeepCopyFrom(status.get()), 0) << "another class is refused";
+}
+
+TEST(Machinery, RequestFilesRoundTrip) {
+    const char* text =
+        "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n<OFX><SIGNONMSGSRQV1><SONRQ><DTCLIENT>20240105"
+        "<USERID>u<USERPASS>pw<LANGUAGE>ENG<APPID>QWIN<APPVER>2700</SONRQ></SIGNONMSGSRQV1>"
+        "<BANKMSGSRQV1><STMTTRNRQ><TRNUID>1<STMTRQ><BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS"
+        "</BANKACCTFROM><INCTRAN><INCLUDE>N</INCTRAN></STMTRQ></STMTTRNRQ></BANKMSGSRQV1></OFX>";
+    std::unique_ptr<OEFileRq> file(F()->NewFileRq(0));
+    ASSERT_EQ(ParseInto(text, file.get(), 1), OEPS_OK);
+    OEMessageSetRq* bank = file->GetRequest(0)->GetMessageSet(1);
+    ASSERT_NE(bank, nullptr);
+    EXPECT_EQ(bank->GetTrans(0)->GetMsgsRqTag(), OETAG_BANKMSGSRQV1);
+    std::string built = BuildText(file.get());
+    std::unique_ptr<OEFileRq> again(F()->NewFileRq(0));
+    ASSERT_EQ(ParseInto(built, again.get(), 1), OEPS_OK);
+    EXPECT_EQ(BuildText(again.get()), built);
+    bool masked = true;
+    for (unsigned short i = 0; i < LogCount(); ++i)
+        if (std::string(LogEntry(i)->GetText().c_str()).find("pw") != std::string::npos) masked = false;
+    EXPECT_TRUE(masked);
+}
+
+// A host factory: every parsed transaction comes out as the host's own class.
+class HostTx : public OEBankStatementTx {
+public:
+    explicit HostTx(unsigned short v = 0) : OEBankStatementTx(v) {}
+};
+class HostFactory : public OEDataObjFactory {
+public:
+    OEBankStatementTx* NewBankStatementTx(unsigned short version) override { return Create<HostTx>(version); }
+};
+
+TEST(Machinery, HostFactoryDecidesTheClassesOfAParsedTree) {
+    HostFactory host;
+    OEDataObj::SetFactory(&host);
+    std::unique_ptr<OEFileRs> file(host.NewFileRs(0));
+    OEParseStatus status = ParseInto(kOneStatement, file.get());
+    OEBankStatementTx* tx = nullptr;
+    if (status == OEPS_OK) {
+        auto* stmt = dynamic_cast<OECCStatementRs*>(
+            file->GetResponse(0)->GetMessageSet(1)->GetTrans(0)->GetActualTrans());
+        tx = stmt ? stmt->GetTransactionList()->GetStatementTx(0) : nullptr;
+    }
+    EXPECT_NE(dynamic_cast<HostTx*>(tx), nullptr);
+    file.reset();
+    OEDataObj::SetFactory(nullptr); // the next GetFactory makes a fresh default one
+}
+
+int g_remaining = 0;
+int FailAfter(std::size_t) {
+    return g_remaining-- > 0 ? 0 : 1;
+}
+
+TEST(Machinery, RunningOutOfMemoryIsReportedNotFatal) {
+    std::string text(kOneStatement);
+    // Fail the n-th allocation for a range of n: every parse ends with a status, never a crash.
+    for (int allowed = 0; allowed < 400; allowed += 7) {
+        std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+        OEParseStatus status;
+        {
+            g_remaining = allowed;
+            OEMemory::FailureHook previous = OEMemory::SetFailureHook(&FailAfter);
+            status = ParseInto(text, file.get());
+            OEMemory::SetFailureHook(previous);
+        }
+        EXPECT_TRUE(status == OEPS_OK || status == OEPS_NORESOURCE || status == OEPS_WARNINGS ||
+                    status == OEPS_INVALID)
+            << allowed << ": " << status;
+        OEThreadState::SetErrorCode(OETE_NONE);
+    }
+    // Out of memory during a build turns into status 1.
+    std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+    ASSERT_EQ(ParseInto(text, file.get()), OEPS_OK);
+    struct Never {
+        static int Fail(std::size_t) { return 1; }
+    };
+    OEBuffer out(16, 16);
+    OEBuilder builder;
+    OEMemory::FailureHook previous = OEMemory::SetFailureHook(&Never::Fail);
+    int status = builder.Build(&out, file.get(), OEBSO_STRICT, 0, 0);
+    OEMemory::SetFailureHook(previous);
+    EXPECT_EQ(status, OEBS_OUTOFMEMORY);
+    EXPECT_EQ(builder.GetFailedObject(), file.get());
+    OEThreadState::SetErrorCode(OETE_NONE);
+}
+
+} // namespace
