@@ -6,6 +6,7 @@
 #include "cmd_send.h"
 
 #include "oesdk.h"
+#include "support.h"
 
 #include <chrono>
 #include <cstdio>
@@ -13,14 +14,6 @@
 #include <cstring>
 #include <string>
 #include <vector>
-
-const char kOESDKSendUsage[] =
-    "  send URL REQUEST.ofx [--out REPLY.ofx] [--ca FILE] [--timeout S] [--log]\n"
-    "                   post a request file to URL (https: with certificate checks, http:,\n"
-    "                   or file: to read a reply from disk) and save the reply (default:\n"
-    "                   REQUEST.reply.ofx). --ca trusts only the roots in FILE (PEM or DER)\n"
-    "                   for this exchange; --timeout in seconds (default 60); --log shows\n"
-    "                   the transport's log lines\n";
 
 namespace {
 
@@ -114,11 +107,35 @@ int OnPump(void*) {
             std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu of %lu bytes transferred ", seconds,
                          g_progress.done, g_progress.total);
         else
-            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu bytes transferred ", seconds, g_progress.done);
+            std::fprintf(stderr, "\rwaiting for the server: %.1f s, %lu bytes transferred ", seconds,
+                         g_progress.done);
         std::fflush(stderr);
         g_progress.shown = true;
     }
     return 0;
+}
+
+// The sign-on status of the saved answer, as the parser reads it.
+void PrintSignOnStatus(const std::string& path) {
+    Document doc;
+    std::string error;
+    if (!LoadDocument(path.c_str(), false, doc, error)) {
+        std::printf("sign-on status: none (%s)\n", error.c_str());
+        return;
+    }
+    OESignOnRs* signOn = nullptr;
+    WalkTree(doc.file.get(), 0, [&](OEDataObj* object, int) {
+        if (!signOn && object->GetType() == OETAG_SONRS) signOn = static_cast<OESignOnRs*>(object);
+    });
+    OEStatus* status = signOn ? signOn->GetStatus() : nullptr;
+    if (!status) {
+        std::printf("sign-on status: none (parse status %d, no sign-on response)\n",
+                    static_cast<int>(doc.status));
+        return;
+    }
+    OEString severity;
+    OEDataConversion::StatusSeverityToString(status->GetSeverity(), severity);
+    std::printf("sign-on status: %ld %s\n", status->GetCode(), severity.c_str());
 }
 
 } // namespace
@@ -247,6 +264,7 @@ int OESDKCommandSend(int argc, char** argv) {
             } else {
                 std::printf("reply: %zu bytes saved to %s\n", n, outPath.c_str());
                 exitCode = 0;
+                PrintSignOnStatus(outPath);
             }
         }
     }

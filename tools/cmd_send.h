@@ -4,10 +4,8 @@
 
 // oesdk send URL REQUEST.ofx [--out REPLY.ofx] [--ca FILE] [--timeout S] [--log]
 // argv holds the arguments after "send". Returns the process exit code: 0 when the reply came
-// back and was saved, 1 when the exchange failed, 2 for a usage error.
+// back and was saved, 1 when the exchange failed, 2 for a usage error. Registered with the
+// tool in cmd_send_register.cpp.
 int OESDKCommandSend(int argc, char** argv);
-
-// Usage lines for the tool's help text.
-extern const char kOESDKSendUsage[];
 
 #endif

@@ -49,11 +49,14 @@ TEST_F(SendCommand, PostsSavesAndKeepsCredentialsOut) {
     EXPECT_NE(r.out.find("saved to " + out), std::string::npos) << r.out;
     EXPECT_NE(r.err.find("VRN: Beginning send to https://***@localhost"), std::string::npos) << r.err;
     EXPECT_EQ(nettest::Slurp(out), nettest::Slurp(request)); // the echo server sent the request back
+    EXPECT_NE(r.out.find("sign-on status: none"), std::string::npos) << r.out; // a request, not an answer
     EXPECT_EQ((r.out + r.err).find("s3cret"), std::string::npos) << r.out << r.err;
 
-    // Default reply name beside the request; a slow answer shows progress.
+    // Default reply name beside the request; a slow answer shows progress; the statement's
+    // sign-on status is read by the parser.
     r = Send({base + "/slow/1600", request, "--ca", fixture + "/ca.der"});
     EXPECT_EQ(r.code, 0) << r.out << r.err;
+    EXPECT_NE(r.out.find("sign-on status: 0 INFO\n"), std::string::npos) << r.out;
     EXPECT_TRUE(nettest::Exists((std::filesystem::path(dir) / "request.reply.ofx").string()));
     EXPECT_NE(r.err.find("waiting for the server: "), std::string::npos) << r.err;
 }

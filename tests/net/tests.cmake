@@ -16,5 +16,5 @@ set_tests_properties(net_https_stop PROPERTIES FIXTURES_CLEANUP net_https)
 set_tests_properties(${layer} PROPERTIES FIXTURES_REQUIRED net_https
   ENVIRONMENT "OESDK_NET_FIXTURE=${_net_fixture_dir};no_proxy=*;NO_PROXY=*;http_proxy=;https_proxy=;HTTPS_PROXY=")
 # The tool's send command is tested here, against the same server.
-target_sources(${_exe} PRIVATE ${PROJECT_SOURCE_DIR}/tools/cmd_send.cpp)
+target_sources(${_exe} PRIVATE ${PROJECT_SOURCE_DIR}/tools/cmd_send.cpp ${PROJECT_SOURCE_DIR}/tools/support.cpp)
 target_include_directories(${_exe} PRIVATE ${PROJECT_SOURCE_DIR}/tools)
