@@ -7,6 +7,7 @@
 
 // Platform layer
 #include "platform/oeplatform.h"
+#include "platform/oehttpclient.h"
 
 // Foundation types
 #include "foundation/oememory.h"
@@ -55,5 +56,10 @@
 #include "messages/oemsgset.h"
 #include "messages/oebank.h"
 #include "messages/oeprofile.h"
+
+// Transport
+#include "net/oenetacc.h"
+#include "net/vrnacc.h"
+#include "net/recvacc.h"
 
 #endif
