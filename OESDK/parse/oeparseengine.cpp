@@ -151,6 +151,10 @@ OEHeaderTag HeaderTagOf(const char* name, std::size_t length) {
     return OEHT_UNKNOWN;
 }
 
+// A tag name longer than a string can hold is malformed: lookups and log texts carry 16-bit
+// lengths, and a cut-down name could otherwise pass for a real tag.
+const unsigned long kMaxNameLength = OEString::kMaxLength;
+
 void AssignRange(OEString& out, const char* p, std::size_t n) {
     const std::size_t maxLength = OEString::kMaxLength;
     out.Assign(p, static_cast<unsigned short>(n > maxLength ? maxLength : n));
@@ -351,7 +355,7 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     bool selfClosing = !endTag && gt > lt + 1 && base[gt - 1] == '/';
     if (selfClosing && nameEnd == gt) --nameEnd; // "<MEMO/>"
     token.m_next = gt + 1;
-    if (nameEnd <= nameStart || nameEnd - nameStart > 0xFFFF) {
+    if (nameEnd <= nameStart || nameEnd - nameStart > kMaxNameLength) {
         token.m_kind = kRawBad;
         token.m_start = lt;
         token.m_length = gt + 1 - lt;
@@ -538,7 +542,7 @@ void OEParseEngine::ScanRaw(RawToken& token) {
             const unsigned long nameStart = r;
             if (r < m_size && base[r] != '!' && base[r] != '?') {
                 while (r < m_size && !kNameStop.m_stop[static_cast<unsigned char>(base[r])]) ++r;
-                if (r < m_size && base[r] == '>' && r > nameStart) {
+                if (r < m_size && base[r] == '>' && r > nameStart && r - nameStart <= kMaxNameLength) {
                     token.m_kind = endTag ? kRawEndTag : kRawStart;
                     token.m_tagStart = p;
                     token.m_start = nameStart;

@@ -168,6 +168,9 @@ TEST(Parser, StoppingStatuses) {
         {nested + "<BANKTRANLIST><DTSTART>1", OEPS_INVALID, nullptr, OETAG_BANKTRANLIST},
         {nested + "</STMTTRNRS>", OEPS_BADENDTAG, "OEPW_INVALIDENDAGG STMTTRNRS", OETAG_STMTRS},
         {nested + "<TRNAMT 5", OEPS_INVALID, "OEPW_BADFORMAT <TRNAMT 5", OETAG_STMTRS},
+        // A name too long for a 16-bit length is malformed, not a cut-down CURDEF.
+        {nested + "<CURDEF" + std::string(65536, 'X') + ">EUR", OEPS_INVALID, "OEPW_BADFORMAT <CURDEFX",
+         OETAG_STMTRS},
         {nested + "</CURDEF> stray text <CURDEF>", OEPS_INVALID, "OEPW_UNKNOWNTAG stray text", OETAG_STMTRS},
     };
     for (const auto& c : cases) {
