@@ -366,6 +366,37 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     token.m_length = nameEnd - nameStart;
 }
 
+#ifdef OESDK_SCAN_SSE2
+// A plain "<NAME>" or "</NAME>" whose ">" lies within the 16 bytes after the "<" at p (which the
+// caller has checked are in the buffer): one load finds the ">" and anything that would end the
+// name before it. Fills the token and returns true, or false for any other tag.
+OE_ALWAYS_INLINE bool OEParseEngine::ScanShortTag(unsigned long p, RawToken& token) const {
+    const char* base = m_data;
+    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
+    const unsigned gt = static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
+    if (!gt) return false;
+    __m128i stop = _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
+    const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
+    const bool endTag = base[p + 1] == '/';
+    const unsigned from = endTag ? 1u : 0u;
+    const unsigned before = static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
+    const char first = base[p + 1 + from];
+    if (before || i <= from || first == '!' || first == '?') return false;
+    token.m_kind = endTag ? kRawEndTag : kRawStart;
+    token.m_tagStart = p;
+    token.m_start = p + 1 + from;
+    token.m_length = i - from;
+    token.m_next = p + 2 + i;
+    token.m_hasAmp = -1;
+    token.m_hasNul = false;
+    return true;
+}
+#endif
+
 // The hot path of the scanner: whitespace, a text, or a plain "<NAME>" / "</NAME>" tag.
 // Everything else (comments, CDATA, odd or broken tags, short tails) goes to ScanRaw.
 OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
@@ -408,31 +439,7 @@ OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
         token.m_hasNul = nul != 0;
         return;
     }
-    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
-    const unsigned gt = static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
-    if (gt) {
-        __m128i stop =
-            _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
-        const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
-        const bool endTag = base[p + 1] == '/';
-        const unsigned from = endTag ? 1u : 0u;
-        const unsigned before = static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
-        const char first = base[p + 1 + from];
-        if (!before && i > from && first != '!' && first != '?') {
-            token.m_kind = endTag ? kRawEndTag : kRawStart;
-            token.m_tagStart = p;
-            token.m_start = p + 1 + from;
-            token.m_length = i - from;
-            token.m_next = p + 2 + i;
-            token.m_hasAmp = -1;
-            token.m_hasNul = false;
-            return;
-        }
-    }
+    if (ScanShortTag(p, token)) return;
 #endif
     ScanRaw(token);
 }
@@ -505,36 +512,7 @@ void OEParseEngine::ScanRaw(RawToken& token) {
         {
             // The common tag, "<NAME>" or "</NAME>".
 #ifdef OESDK_SCAN_SSE2
-            if (p + 17 <= m_size) {
-                // Sixteen bytes after the "<" at once: the first ">" and anything that would end
-                // the name before it.
-                const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
-                const unsigned gt =
-                    static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
-                if (gt) {
-                    __m128i stop = _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')),
-                                                _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
-                    const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
-                    const bool endTag = base[p + 1] == '/';
-                    const unsigned from = endTag ? 1u : 0u;
-                    const unsigned before =
-                        static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
-                    const char first = base[p + 1 + from];
-                    if (!before && i > from && first != '!' && first != '?') {
-                        token.m_kind = endTag ? kRawEndTag : kRawStart;
-                        token.m_tagStart = p;
-                        token.m_start = p + 1 + from;
-                        token.m_length = i - from;
-                        token.m_next = p + 2 + i;
-                        token.m_hasAmp = -1;
-                        return;
-                    }
-                }
-            }
+            if (p + 17 <= m_size && ScanShortTag(p, token)) return;
 #endif
             unsigned long r = p + 1;
             const bool endTag = r < m_size && base[r] == '/';
