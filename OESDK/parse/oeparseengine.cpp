@@ -1,6 +1,7 @@
 #include "parse/oeparseengine.h"
 
 #include "foundation/oebuffer.h"
+#include "foundation/oedataconv.h"
 #include "foundation/oeparsewarning.h"
 #include "parse/oeutility.h"
 
@@ -139,15 +140,17 @@ const NameIndex& TheNameIndex() {
 
 const NameIndex* g_nameIndex = nullptr; // set by every engine's constructor (always the same index)
 
-// The OFX header names (the keyword table of the header conversion), matched ignoring case.
-// CONTENT-TYPE and CONTENT-LENGTH have no keyword: they come back as OEHT_UNKNOWN, with their
-// name, and so are kept as MIME headers.
+// The OFX header names are the keywords of the header conversion (OFXHEADER to NEWFILEUID), matched
+// ignoring case but, unlike the conversion itself, without logging a miss: CONTENT-TYPE,
+// CONTENT-LENGTH and any other name come back as OEHT_UNKNOWN with their name, for the file object
+// to keep as MIME headers.
 OEHeaderTag HeaderTagOf(const char* name, std::size_t length) {
-    static const char* const kNames[] = {"OFXHEADER", "DATA",        "VERSION",    "SECURITY",  "ENCODING",
-                                         "CHARSET",   "COMPRESSION", "OLDFILEUID", "NEWFILEUID"};
-    for (int i = 0; i < 9; ++i)
-        if (std::strlen(kNames[i]) == length && EqualsIgnoringCase(kNames[i], name, length))
-            return static_cast<OEHeaderTag>(OEHT_OFXHEADER + i);
+    for (int t = OEHT_OFXHEADER; t <= OEHT_NEWFILEUID; ++t) {
+        OEString keyword;
+        if (OEDataConversion::HeaderTagToString(static_cast<OEHeaderTag>(t), keyword) &&
+            keyword.GetStrLength() == length && EqualsIgnoringCase(keyword.c_str(), name, length))
+            return static_cast<OEHeaderTag>(t);
+    }
     return OEHT_UNKNOWN;
 }
 
