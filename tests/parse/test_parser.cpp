@@ -222,6 +222,9 @@ TEST(Parser, PasswordNeverStaysInClear) {
         for (const auto& line : testagg::LogLines())
             EXPECT_EQ(line.find("s3cret"), std::string::npos) << line;
     }
+    // Misplaced, the element is logged with its name and the masked value.
+    EXPECT_EQ(testagg::LogLines().back(),
+              "OEPW_INVALIDELEM USERPASS|****** " + std::to_string(OETAG_USERPASS));
     // A reporter that logs the password itself is masked by the log.
     OELogParseWarning(OEPW_TOOLONG, "s3cret", "s3cret", OETAG_USERPASS);
     EXPECT_EQ(testagg::LogLines().back(), "OEPW_TOOLONG ******|****** " + std::to_string(OETAG_USERPASS));
