@@ -709,6 +709,9 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
                 m_elementNameStart = token.m_start;
                 m_elementNameLength = nameLength;
                 if (!ReadText(next)) return OETK_ERROR;
+                // No string holds more than kMaxLength bytes: the value goes on cut, and logged.
+                if (next.m_length > OEString::kMaxLength)
+                    LogAt(token.m_tagStart, OEPW_TOOLONG, name, nameLength, entry->m_id);
                 return OETK_ELEMENT;
             }
             m_elementEntry = nullptr;

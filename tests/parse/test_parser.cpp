@@ -137,6 +137,11 @@ TEST(Parser, IrregularitiesAreLoggedAndParsingGoesOn) {
          OEPS_WARNINGS,
          {"OEPW_BADFORMAT TRNAMT|BAD " + std::to_string(OETAG_TRNAMT)},
          "STMTTRN{FITID=1;}"},
+        // A value longer than any string is cut and logged.
+        {InTransaction("<FITID>1<MEMO>" + std::string(70000, 'm')),
+         OEPS_WARNINGS,
+         {"OEPW_TOOLONG MEMO| " + std::to_string(OETAG_MEMO)},
+         "FITID=1;"},
         // Text after the end of the body is not read.
         {InTransaction("<FITID>1") + "garbage <<< </NOPE>", OEPS_OK, {}, "FITID=1;"},
     };
