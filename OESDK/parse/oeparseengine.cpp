@@ -369,6 +369,19 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     token.m_length = nameEnd - nameStart;
 }
 
+namespace {
+// A text token from p up to the "<" (or the end of the buffer) at `end`, trailing whitespace trimmed.
+template <class Token>
+inline void FillText(const char* base, unsigned long p, unsigned long end, int kind, Token& token) {
+    unsigned long last = end;
+    while (last > p && IsSpace(base[last - 1])) --last;
+    token.m_kind = kind;
+    token.m_tagStart = token.m_start = p;
+    token.m_length = last - p;
+    token.m_next = end;
+}
+} // namespace
+
 #ifdef OESDK_SCAN_SSE2
 // A plain "<NAME>" or "</NAME>" whose ">" lies within the 16 bytes after the "<" at p (which the
 // caller has checked are in the buffer): one load finds the ">" and anything that would end the
@@ -432,12 +445,7 @@ OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
             nul |= zero;
             end += 16;
         }
-        unsigned long last = end;
-        while (last > p && IsSpace(base[last - 1])) --last;
-        token.m_kind = kRawText;
-        token.m_tagStart = token.m_start = p;
-        token.m_length = last - p;
-        token.m_next = end;
+        FillText(base, p, end, kRawText, token);
         token.m_hasAmp = amp ? 1 : 0;
         token.m_hasNul = nul != 0;
         return;
@@ -503,12 +511,7 @@ void OEParseEngine::ScanRaw(RawToken& token) {
                 if (am) amp = 1;
                 end += 8;
             }
-            unsigned long last = end;
-            while (last > p && IsSpace(base[last - 1])) --last;
-            token.m_kind = kRawText;
-            token.m_tagStart = token.m_start = p;
-            token.m_length = last - p;
-            token.m_next = end;
+            FillText(base, p, end, kRawText, token);
             token.m_hasAmp = amp;
             return;
         }
