@@ -1,6 +1,7 @@
 #include "parse/oeparseengine.h"
 
 #include "foundation/oebuffer.h"
+#include "foundation/oedataconv.h"
 #include "foundation/oeparsewarning.h"
 #include "parse/oeutility.h"
 
@@ -139,17 +140,23 @@ const NameIndex& TheNameIndex() {
 
 const NameIndex* g_nameIndex = nullptr; // set by every engine's constructor (always the same index)
 
-// The OFX header names (the keyword table of the header conversion), matched ignoring case.
-// CONTENT-TYPE and CONTENT-LENGTH have no keyword: they come back as OEHT_UNKNOWN, with their
-// name, and so are kept as MIME headers.
+// The OFX header names are the keywords of the header conversion (OFXHEADER to NEWFILEUID), matched
+// ignoring case but, unlike the conversion itself, without logging a miss: CONTENT-TYPE,
+// CONTENT-LENGTH and any other name come back as OEHT_UNKNOWN with their name, for the file object
+// to keep as MIME headers.
 OEHeaderTag HeaderTagOf(const char* name, std::size_t length) {
-    static const char* const kNames[] = {"OFXHEADER", "DATA",        "VERSION",    "SECURITY",  "ENCODING",
-                                         "CHARSET",   "COMPRESSION", "OLDFILEUID", "NEWFILEUID"};
-    for (int i = 0; i < 9; ++i)
-        if (std::strlen(kNames[i]) == length && EqualsIgnoringCase(kNames[i], name, length))
-            return static_cast<OEHeaderTag>(OEHT_OFXHEADER + i);
+    for (int t = OEHT_OFXHEADER; t <= OEHT_NEWFILEUID; ++t) {
+        OEString keyword;
+        if (OEDataConversion::HeaderTagToString(static_cast<OEHeaderTag>(t), keyword) &&
+            keyword.GetStrLength() == length && EqualsIgnoringCase(keyword.c_str(), name, length))
+            return static_cast<OEHeaderTag>(t);
+    }
     return OEHT_UNKNOWN;
 }
+
+// A tag name longer than a string can hold is malformed: lookups and log texts carry 16-bit
+// lengths, and a cut-down name could otherwise pass for a real tag.
+const unsigned long kMaxNameLength = OEString::kMaxLength;
 
 void AssignRange(OEString& out, const char* p, std::size_t n) {
     const std::size_t maxLength = OEString::kMaxLength;
@@ -351,7 +358,7 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     bool selfClosing = !endTag && gt > lt + 1 && base[gt - 1] == '/';
     if (selfClosing && nameEnd == gt) --nameEnd; // "<MEMO/>"
     token.m_next = gt + 1;
-    if (nameEnd <= nameStart || nameEnd - nameStart > 0xFFFF) {
+    if (nameEnd <= nameStart || nameEnd - nameStart > kMaxNameLength) {
         token.m_kind = kRawBad;
         token.m_start = lt;
         token.m_length = gt + 1 - lt;
@@ -361,6 +368,50 @@ void OEParseEngine::ScanTag(unsigned long lt, RawToken& token) {
     token.m_start = nameStart;
     token.m_length = nameEnd - nameStart;
 }
+
+namespace {
+// A text token from p up to the "<" (or the end of the buffer) at `end`, trailing whitespace trimmed.
+template <class Token>
+inline void FillText(const char* base, unsigned long p, unsigned long end, int kind, Token& token) {
+    unsigned long last = end;
+    while (last > p && IsSpace(base[last - 1])) --last;
+    token.m_kind = kind;
+    token.m_tagStart = token.m_start = p;
+    token.m_length = last - p;
+    token.m_next = end;
+}
+} // namespace
+
+#ifdef OESDK_SCAN_SSE2
+// A plain "<NAME>" or "</NAME>" whose ">" lies within the 16 bytes after the "<" at p (which the
+// caller has checked are in the buffer): one load finds the ">" and anything that would end the
+// name before it. Fills the token and returns true, or false for any other tag.
+OE_ALWAYS_INLINE bool OEParseEngine::ScanShortTag(unsigned long p, RawToken& token) const {
+    const char* base = m_data;
+    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
+    const unsigned gt = static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
+    if (!gt) return false;
+    __m128i stop = _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
+    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
+    const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
+    const bool endTag = base[p + 1] == '/';
+    const unsigned from = endTag ? 1u : 0u;
+    const unsigned before = static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
+    const char first = base[p + 1 + from];
+    if (before || i <= from || first == '!' || first == '?') return false;
+    token.m_kind = endTag ? kRawEndTag : kRawStart;
+    token.m_tagStart = p;
+    token.m_start = p + 1 + from;
+    token.m_length = i - from;
+    token.m_next = p + 2 + i;
+    token.m_hasAmp = -1;
+    token.m_hasNul = false;
+    return true;
+}
+#endif
 
 // The hot path of the scanner: whitespace, a text, or a plain "<NAME>" / "</NAME>" tag.
 // Everything else (comments, CDATA, odd or broken tags, short tails) goes to ScanRaw.
@@ -394,41 +445,12 @@ OE_ALWAYS_INLINE void OEParseEngine::ScanFast(RawToken& token) {
             nul |= zero;
             end += 16;
         }
-        unsigned long last = end;
-        while (last > p && IsSpace(base[last - 1])) --last;
-        token.m_kind = kRawText;
-        token.m_tagStart = token.m_start = p;
-        token.m_length = last - p;
-        token.m_next = end;
+        FillText(base, p, end, kRawText, token);
         token.m_hasAmp = amp ? 1 : 0;
         token.m_hasNul = nul != 0;
         return;
     }
-    const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
-    const unsigned gt = static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
-    if (gt) {
-        __m128i stop =
-            _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
-        stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
-        const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
-        const bool endTag = base[p + 1] == '/';
-        const unsigned from = endTag ? 1u : 0u;
-        const unsigned before = static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
-        const char first = base[p + 1 + from];
-        if (!before && i > from && first != '!' && first != '?') {
-            token.m_kind = endTag ? kRawEndTag : kRawStart;
-            token.m_tagStart = p;
-            token.m_start = p + 1 + from;
-            token.m_length = i - from;
-            token.m_next = p + 2 + i;
-            token.m_hasAmp = -1;
-            token.m_hasNul = false;
-            return;
-        }
-    }
+    if (ScanShortTag(p, token)) return;
 #endif
     ScanRaw(token);
 }
@@ -489,48 +511,14 @@ void OEParseEngine::ScanRaw(RawToken& token) {
                 if (am) amp = 1;
                 end += 8;
             }
-            unsigned long last = end;
-            while (last > p && IsSpace(base[last - 1])) --last;
-            token.m_kind = kRawText;
-            token.m_tagStart = token.m_start = p;
-            token.m_length = last - p;
-            token.m_next = end;
+            FillText(base, p, end, kRawText, token);
             token.m_hasAmp = amp;
             return;
         }
         {
             // The common tag, "<NAME>" or "</NAME>".
 #ifdef OESDK_SCAN_SSE2
-            if (p + 17 <= m_size) {
-                // Sixteen bytes after the "<" at once: the first ">" and anything that would end
-                // the name before it.
-                const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(base + p + 1));
-                const unsigned gt =
-                    static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8('>'))));
-                if (gt) {
-                    __m128i stop = _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')),
-                                                _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8(' ')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\n')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\r')));
-                    stop = _mm_or_si128(stop, _mm_cmpeq_epi8(v, _mm_set1_epi8('\t')));
-                    const unsigned i = static_cast<unsigned>(__builtin_ctz(gt));
-                    const bool endTag = base[p + 1] == '/';
-                    const unsigned from = endTag ? 1u : 0u;
-                    const unsigned before =
-                        static_cast<unsigned>(_mm_movemask_epi8(stop)) & ((1u << i) - 1) & ~from;
-                    const char first = base[p + 1 + from];
-                    if (!before && i > from && first != '!' && first != '?') {
-                        token.m_kind = endTag ? kRawEndTag : kRawStart;
-                        token.m_tagStart = p;
-                        token.m_start = p + 1 + from;
-                        token.m_length = i - from;
-                        token.m_next = p + 2 + i;
-                        token.m_hasAmp = -1;
-                        return;
-                    }
-                }
-            }
+            if (p + 17 <= m_size && ScanShortTag(p, token)) return;
 #endif
             unsigned long r = p + 1;
             const bool endTag = r < m_size && base[r] == '/';
@@ -538,7 +526,7 @@ void OEParseEngine::ScanRaw(RawToken& token) {
             const unsigned long nameStart = r;
             if (r < m_size && base[r] != '!' && base[r] != '?') {
                 while (r < m_size && !kNameStop.m_stop[static_cast<unsigned char>(base[r])]) ++r;
-                if (r < m_size && base[r] == '>' && r > nameStart) {
+                if (r < m_size && base[r] == '>' && r > nameStart && r - nameStart <= kMaxNameLength) {
                     token.m_kind = endTag ? kRawEndTag : kRawStart;
                     token.m_tagStart = p;
                     token.m_start = nameStart;
@@ -724,6 +712,9 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
                 m_elementNameStart = token.m_start;
                 m_elementNameLength = nameLength;
                 if (!ReadText(next)) return OETK_ERROR;
+                // No string holds more than kMaxLength bytes: the value goes on cut, and logged.
+                if (next.m_length > OEString::kMaxLength)
+                    LogAt(token.m_tagStart, OEPW_TOOLONG, name, nameLength, entry->m_id);
                 return OETK_ELEMENT;
             }
             m_elementEntry = nullptr;

@@ -97,6 +97,7 @@ private:
 
     OE_INTERNAL void ScanRaw(RawToken& token);
     OE_INTERNAL void ScanFast(RawToken& token);
+    OE_INTERNAL bool ScanShortTag(unsigned long p, RawToken& token) const;
     OE_INTERNAL const OETagDictionaryEntry* Resolve(const RawToken& token);
     OE_INTERNAL void ScanTag(unsigned long lt, RawToken& token);
     OE_INTERNAL unsigned short ReadText(const RawToken& token);

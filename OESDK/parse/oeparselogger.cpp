@@ -48,11 +48,14 @@ unsigned short OEParseLogger::AppendParseException(OEParseException* exception) 
         delete exception;
         return 1;
     }
-    // A password is never kept in clear, whoever reports it.
+    // A password is never kept in clear, whoever reports it and in whichever text; the element's
+    // own name (the text of a misplaced-element record) stays readable.
     if (exception->GetTag() == OETAG_USERPASS) {
         OEString masked(exception->GetText());
-        OEUtility::MaskText(masked);
-        exception->SetText(masked);
+        if (masked.strcmpi("USERPASS") != 0) {
+            OEUtility::MaskText(masked);
+            exception->SetText(masked);
+        }
         masked = exception->GetAuxText();
         OEUtility::MaskText(masked);
         exception->SetAuxText(masked);

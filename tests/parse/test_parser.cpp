@@ -137,6 +137,11 @@ TEST(Parser, IrregularitiesAreLoggedAndParsingGoesOn) {
          OEPS_WARNINGS,
          {"OEPW_BADFORMAT TRNAMT|BAD " + std::to_string(OETAG_TRNAMT)},
          "STMTTRN{FITID=1;}"},
+        // A value longer than any string is cut and logged.
+        {InTransaction("<FITID>1<MEMO>" + std::string(70000, 'm')),
+         OEPS_WARNINGS,
+         {"OEPW_TOOLONG MEMO| " + std::to_string(OETAG_MEMO)},
+         "FITID=1;"},
         // Text after the end of the body is not read.
         {InTransaction("<FITID>1") + "garbage <<< </NOPE>", OEPS_OK, {}, "FITID=1;"},
     };
@@ -168,6 +173,9 @@ TEST(Parser, StoppingStatuses) {
         {nested + "<BANKTRANLIST><DTSTART>1", OEPS_INVALID, nullptr, OETAG_BANKTRANLIST},
         {nested + "</STMTTRNRS>", OEPS_BADENDTAG, "OEPW_INVALIDENDAGG STMTTRNRS", OETAG_STMTRS},
         {nested + "<TRNAMT 5", OEPS_INVALID, "OEPW_BADFORMAT <TRNAMT 5", OETAG_STMTRS},
+        // A name too long for a 16-bit length is malformed, not a cut-down CURDEF.
+        {nested + "<CURDEF" + std::string(65536, 'X') + ">EUR", OEPS_INVALID, "OEPW_BADFORMAT <CURDEFX",
+         OETAG_STMTRS},
         {nested + "</CURDEF> stray text <CURDEF>", OEPS_INVALID, "OEPW_UNKNOWNTAG stray text", OETAG_STMTRS},
     };
     for (const auto& c : cases) {
@@ -219,6 +227,9 @@ TEST(Parser, PasswordNeverStaysInClear) {
         for (const auto& line : testagg::LogLines())
             EXPECT_EQ(line.find("s3cret"), std::string::npos) << line;
     }
+    // Misplaced, the element is logged with its name and the masked value.
+    EXPECT_EQ(testagg::LogLines().back(),
+              "OEPW_INVALIDELEM USERPASS|****** " + std::to_string(OETAG_USERPASS));
     // A reporter that logs the password itself is masked by the log.
     OELogParseWarning(OEPW_TOOLONG, "s3cret", "s3cret", OETAG_USERPASS);
     EXPECT_EQ(testagg::LogLines().back(), "OEPW_TOOLONG ******|****** " + std::to_string(OETAG_USERPASS));
