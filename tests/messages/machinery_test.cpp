@@ -166,6 +166,9 @@ public:
 
 TEST(Machinery, HostFactoryDecidesTheClassesOfAParsedTree) {
     HostFactory host;
+    // The library keeps the factory it made (its flag is cleared by every construction), so the
+    // test hands it back afterwards rather than losing it.
+    OEDataObjFactory* previous = OEDataObj::GetFactory();
     OEDataObj::SetFactory(&host);
     std::unique_ptr<OEFileRs> file(host.NewFileRs(0));
     OEParseStatus status = ParseInto(kOneStatement, file.get());
@@ -177,7 +180,7 @@ TEST(Machinery, HostFactoryDecidesTheClassesOfAParsedTree) {
     }
     EXPECT_NE(dynamic_cast<HostTx*>(tx), nullptr);
     file.reset();
-    OEDataObj::SetFactory(nullptr); // the next GetFactory makes a fresh default one
+    OEDataObj::SetFactory(previous);
 }
 
 int g_remaining = 0;
