@@ -216,8 +216,9 @@ const char* TagDictionary::GetTagString(OETagID id) const {
 OETagDictionary::OETagDictionary() : TagDictionary(GetOETagDictionary(), NumberOfOEDictionaryEntry()) {}
 
 OETagDictionary::~OETagDictionary() {
-    OETagDictionary* self = this;
-    ms_theOETagDictionary.compare_exchange_strong(self, nullptr);
+    // Any dictionary's end retires the singleton, not only the singleton's own: a copy shares its
+    // indexes, so after one of the two is gone the next lookup must build a fresh dictionary.
+    ms_theOETagDictionary.store(nullptr, std::memory_order_release);
 }
 
 OETagDictionary* OETagDictionary::TheOETagDictionary() {

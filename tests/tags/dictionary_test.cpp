@@ -131,6 +131,12 @@ TEST(TagDictionary, DestroyAndRebuild) {
     OETagDictionary* second = OETagDictionary::TheOETagDictionary();
     ASSERT_NE(second, nullptr);
     EXPECT_STREQ(second->GetTagString(OETAG_STMTTRNRS), "STMTTRNRS");
+    {
+        OETagDictionary local; // the end of any dictionary clears the singleton pointer
+    }
+    EXPECT_EQ(OETagDictionary::ms_theOETagDictionary.load(), nullptr);
+    OETagDictionary::Destroy(second);
+    ASSERT_NE(OETagDictionary::TheOETagDictionary(), nullptr);
 }
 
 TEST(TagDictionary, EveryNameFindsItsOwnRowInBothCaseModes) {
