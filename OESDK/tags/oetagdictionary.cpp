@@ -92,7 +92,12 @@ TagDictionary::TagDictionary(const OETagDictionaryEntry* table, unsigned short c
         return;
     }
     m_nameIndex = static_cast<OECompareInfo*>(OEMemory::Malloc(sizeof(OECompareInfo) * (count ? count : 1)));
-    if (!m_nameIndex) return; // error code 1 already recorded; the dictionary is unusable
+    if (!m_nameIndex) {
+        // Error code 1 is recorded and name lookups find nothing; an id lookup that is tried
+        // anyway scans the table rather than reading an index that is not there.
+        m_mode = kLinearScan;
+        return;
+    }
     for (unsigned short i = 0; i < count; ++i) {
         m_nameIndex[i].m_entry = &table[i];
         m_nameIndex[i].m_length = static_cast<unsigned short>(std::strlen(table[i].m_name));

@@ -106,6 +106,14 @@ TEST(TagDictionary, CustomTablesChooseTheirLookupMode) {
     EXPECT_EQ(id, 11u);
     TagDictionary none(nullptr, 0);
     EXPECT_EQ(none.GetTagID("A", 1, &id, OECaseSensitive), nullptr);
+
+    OEMemory::FailureHook old = OEMemory::SetFailureHook([](std::size_t) { return 1; });
+    TagDictionary noIndex(dense, 3); // unusable, but an id lookup must not crash
+    OEMemory::SetFailureHook(old);
+    EXPECT_FALSE(noIndex.IsUsable());
+    EXPECT_EQ(noIndex.GetTagID("A", 1, &id, OECaseSensitive), nullptr);
+    EXPECT_STREQ(noIndex.GetTagString(static_cast<OETagID>(11)), "BB");
+    OEThreadState::SetErrorCode(0);
 }
 
 TEST(TagDictionary, NameOrderIsLengthFirst) {
