@@ -6,6 +6,7 @@
 #include <cstring>
 #include <set>
 #include <string>
+#include <type_traits>
 
 TEST(TagTable, CountIdsAndNames) {
     const OETagDictionaryEntry* table = GetOETagDictionary();
@@ -115,6 +116,9 @@ TEST(TagDictionary, CustomTablesChooseTheirLookupMode) {
     EXPECT_STREQ(noIndex.GetTagString(static_cast<OETagID>(11)), "BB");
     OEThreadState::SetErrorCode(0);
 }
+
+// Compare and Count are the search object's first two slots: no virtual destructor before them.
+static_assert(!std::has_virtual_destructor<OEBinarySearch>::value, "OEBinarySearch slot order");
 
 TEST(TagDictionary, NameOrderIsLengthFirst) {
     OECompareInfo a{nullptr, 0}, b{nullptr, 0};
