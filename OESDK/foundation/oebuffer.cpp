@@ -5,6 +5,14 @@
 
 #include <cstring>
 
+namespace {
+// Offsets are 32-bit and `unsigned long` is 32-bit on Windows: sums of an offset and a count are
+// taken in 64 bits so that an offset set far out cannot wrap around to a small end.
+inline std::uint64_t End(std::uint32_t offset, unsigned long count) {
+    return static_cast<std::uint64_t>(offset) + count;
+}
+} // namespace
+
 OEBuffer::OEBuffer(unsigned long initial, unsigned long growBy)
     : m_data(nullptr), m_allocation(0), m_growBy(0), m_dataSize(0), m_offset(0) {
     if (initial > kMaxBufferSize) initial = kMaxBufferSize;
@@ -73,10 +81,16 @@ int OEBuffer::EnsureRoom(unsigned long end) {
 
 int OEBuffer::Write(const char* data, unsigned short length) {
     if (!data && length) return OEBR_NOBUFFER;
-    unsigned long end = static_cast<unsigned long>(m_offset) + length;
+    std::uint64_t end64 = End(m_offset, length);
+    if (end64 >= kMaxBufferSize) return m_data ? OEBR_BEYONDEND : OEBR_NOBUFFER;
+    unsigned long end = static_cast<unsigned long>(end64);
+    // Bytes of our own block: find them again after growth has moved the block.
+    const bool own = m_data && data >= m_data && data < m_data + m_allocation;
+    const std::size_t ownOffset = own ? static_cast<std::size_t>(data - m_data) : 0;
     int result = EnsureRoom(end);
     if (result != OEBR_SUCCESS) return result;
-    if (length) std::memcpy(m_data + m_offset, data, length);
+    if (own) data = m_data + ownOffset;
+    if (length) std::memmove(m_data + m_offset, data, length);
     m_offset = static_cast<std::uint32_t>(end);
     m_dataSize = m_offset;
     return OEBR_SUCCESS;
@@ -88,7 +102,6 @@ int OEBuffer::Write(char c) {
 
 int OEBuffer::Write(OEBuffer* other) {
     if (!other || !other->m_data) return OEBR_NOBUFFER;
-    if (other == this) return OEBR_SUCCESS;
     return WriteLarge(other->m_data, other->m_dataSize);
 }
 
@@ -98,6 +111,15 @@ int OEBuffer::WriteString(const char* text) {
 }
 
 int OEBuffer::WriteLarge(const char* data, unsigned long length) {
+    if (m_data && length > kLargeWritePiece && data >= m_data && data < m_data + m_allocation) {
+        // A piece of our own block: the first growth would leave the later pieces behind.
+        char* copy = static_cast<char*>(OEMemory::Malloc(length));
+        if (!copy) return OEBR_GROWFAILED;
+        std::memcpy(copy, data, length);
+        int result = WriteLarge(copy, length);
+        OEMemory::Free(copy);
+        return result;
+    }
     while (length > kLargeWritePiece) {
         int result = Write(data, static_cast<unsigned short>(kLargeWritePiece));
         if (result != OEBR_SUCCESS) return result;
@@ -109,7 +131,7 @@ int OEBuffer::WriteLarge(const char* data, unsigned long length) {
 
 int OEBuffer::GetBufData(char* out, unsigned short count) {
     if (!m_data) return OEBR_NOBUFFER;
-    if (static_cast<unsigned long>(m_offset) + count > m_dataSize) return OEBR_BEYONDEND;
+    if (End(m_offset, count) > m_dataSize) return OEBR_BEYONDEND;
     std::memcpy(out, m_data + m_offset, count);
     m_offset += count;
     return OEBR_SUCCESS;
@@ -191,14 +213,5 @@ int OEBuffer::CompareBuffer(OEBuffer* other) {
 int OEBuffer::CopyBuffer(OEBuffer* source, unsigned long from, unsigned long length) {
     if (!source || !source->m_data) return OEBR_NOBUFFER;
     if (from > source->m_dataSize || length > source->m_dataSize - from) return OEBR_BEYONDEND;
-    if (source == this) {
-        // Copy through a temporary: growing may move the block we read from.
-        char* tmp = static_cast<char*>(OEMemory::Malloc(length ? length : 1));
-        if (!tmp) return OEBR_GROWFAILED;
-        std::memcpy(tmp, m_data + from, length);
-        int result = WriteLarge(tmp, length);
-        OEMemory::Free(tmp);
-        return result;
-    }
     return WriteLarge(source->m_data + from, length);
 }

@@ -89,6 +89,14 @@ unsigned short OEDynamicArrayString::SetString(unsigned short index, const char*
     if (index > Entries()) return 0;
     if (index == Entries()) return AddString(text);
     OEString* s = Get(index);
+    if (!s) { // a gap left by a store past the end: give it a string of its own
+        s = MakeString(text);
+        if (!s || (text && *text && s->IsNull()) || !Set(index, s)) {
+            delete s;
+            return 0;
+        }
+        return 1;
+    }
     unsigned short spec = s->SpecLength();
     *s = text;
     s->SetSpecLength(spec);
@@ -98,8 +106,10 @@ unsigned short OEDynamicArrayString::SetString(unsigned short index, const char*
 unsigned short OEDynamicArrayString::DeepCopyFrom(const OEDynamicArrayString& other) {
     if (&other == this) return 1;
     DeleteAll();
-    for (unsigned short i = 0; i < other.Entries(); ++i)
-        if (!AddString(*other.Get(i))) return 0;
+    for (unsigned short i = 0; i < other.Entries(); ++i) {
+        const OEString* s = other.Get(i);
+        if (!(s ? AddString(*s) : Append(nullptr))) return 0; // gaps are copied as gaps
+    }
     return 1;
 }
 
@@ -111,5 +121,6 @@ OEString* OEDynamicArrayStringLen::MakeString(const char* text) {
 
 void OEDynamicArrayStringLen::SetSpecLength(unsigned short specLength) {
     m_specLength = specLength;
-    for (unsigned short i = 0; i < Entries(); ++i) Get(i)->SetSpecLength(specLength);
+    for (unsigned short i = 0; i < Entries(); ++i)
+        if (OEString* s = Get(i)) s->SetSpecLength(specLength);
 }

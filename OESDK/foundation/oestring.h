@@ -134,7 +134,8 @@ public:
     OEMultiLenString() {}
     OEMultiLenString(const char* text) : OEString(text) {}
     OEMultiLenString(const OEMultiLenString& other) : OEString(other) {}
-    OEMultiLenString(const OEString& other) : OEString(other) {}
+    // Takes the text and encoding only: the limit stays unlimited until the owner sets it.
+    OEMultiLenString(const OEString& other) : OEString(other) { m_specLength = kUnlimited; }
     OEMultiLenString& operator=(const OEString& other) override;
     OEMultiLenString& operator=(const OEMultiLenString& other) {
         operator=(static_cast<const OEString&>(other));

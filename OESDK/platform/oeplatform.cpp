@@ -1,8 +1,30 @@
-// Parts of the platform layer that are the same on every OS: the host message log.
+// Parts of the platform layer that are the same on every OS: the host message log and the
+// host's pump hook.
 #include "platform/oeplatform.h"
+#include "platform/internal/oepumphook.h"
 
 #include <cstdarg>
 #include <cstdio>
+
+namespace OEPlatform {
+
+namespace {
+PumpHook g_pumpHook = nullptr;
+void* g_pumpContext = nullptr;
+} // namespace
+
+PumpHook SetPumpHook(PumpHook hook, void* context) {
+    PumpHook old = g_pumpHook;
+    g_pumpHook = hook;
+    g_pumpContext = context;
+    return old;
+}
+
+int RunPumpHook() {
+    return g_pumpHook && g_pumpHook(g_pumpContext) ? 1 : 0;
+}
+
+} // namespace OEPlatform
 
 namespace Util {
 

@@ -1,5 +1,6 @@
 // POSIX implementation of the platform layer.
 #include "platform/oeplatform.h"
+#include "platform/internal/oepumphook.h"
 
 #include <cerrno>
 #include <ctime>
@@ -8,11 +9,6 @@
 #include <unistd.h>
 
 namespace OEPlatform {
-
-namespace {
-PumpHook g_pumpHook = nullptr;
-void* g_pumpContext = nullptr;
-} // namespace
 
 unsigned long CurrentThreadId() {
 #if defined(SYS_gettid)
@@ -31,14 +27,7 @@ void Sleep(unsigned long milliseconds) {
 }
 
 int PumpMessages() {
-    return g_pumpHook ? (g_pumpHook(g_pumpContext) ? 1 : 0) : 0;
-}
-
-PumpHook SetPumpHook(PumpHook hook, void* context) {
-    PumpHook old = g_pumpHook;
-    g_pumpHook = hook;
-    g_pumpContext = context;
-    return old;
+    return RunPumpHook();
 }
 
 OETime64 Time64(OETime64* out) {

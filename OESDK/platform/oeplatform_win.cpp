@@ -1,5 +1,6 @@
 // Windows implementation of the platform layer.
 #include "platform/oeplatform.h"
+#include "platform/internal/oepumphook.h"
 
 #include <windows.h>
 
@@ -11,9 +12,6 @@
 namespace OEPlatform {
 
 namespace {
-PumpHook g_pumpHook = nullptr;
-void* g_pumpContext = nullptr;
-
 std::wstring Widen(const char* utf8) {
     int n = MultiByteToWideChar(CP_UTF8, 0, utf8, -1, nullptr, 0);
     if (n <= 0) return std::wstring();
@@ -45,15 +43,8 @@ int PumpMessages() {
         TranslateMessage(&msg);
         DispatchMessageA(&msg);
     }
-    if (g_pumpHook && g_pumpHook(g_pumpContext)) quit = 1;
+    if (RunPumpHook()) quit = 1;
     return quit;
-}
-
-PumpHook SetPumpHook(PumpHook hook, void* context) {
-    PumpHook old = g_pumpHook;
-    g_pumpHook = hook;
-    g_pumpContext = context;
-    return old;
 }
 
 OETime64 Time64(OETime64* out) {

@@ -92,7 +92,12 @@ TagDictionary::TagDictionary(const OETagDictionaryEntry* table, unsigned short c
         return;
     }
     m_nameIndex = static_cast<OECompareInfo*>(OEMemory::Malloc(sizeof(OECompareInfo) * (count ? count : 1)));
-    if (!m_nameIndex) return; // error code 1 already recorded; the dictionary is unusable
+    if (!m_nameIndex) {
+        // Error code 1 is recorded and name lookups find nothing; an id lookup that is tried
+        // anyway scans the table rather than reading an index that is not there.
+        m_mode = kLinearScan;
+        return;
+    }
     for (unsigned short i = 0; i < count; ++i) {
         m_nameIndex[i].m_entry = &table[i];
         m_nameIndex[i].m_length = static_cast<unsigned short>(std::strlen(table[i].m_name));
@@ -216,8 +221,9 @@ const char* TagDictionary::GetTagString(OETagID id) const {
 OETagDictionary::OETagDictionary() : TagDictionary(GetOETagDictionary(), NumberOfOEDictionaryEntry()) {}
 
 OETagDictionary::~OETagDictionary() {
-    OETagDictionary* self = this;
-    ms_theOETagDictionary.compare_exchange_strong(self, nullptr);
+    // Any dictionary's end retires the singleton, not only the singleton's own: a copy shares its
+    // indexes, so after one of the two is gone the next lookup must build a fresh dictionary.
+    ms_theOETagDictionary.store(nullptr, std::memory_order_release);
 }
 
 OETagDictionary* OETagDictionary::TheOETagDictionary() {

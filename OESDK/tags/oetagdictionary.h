@@ -34,14 +34,18 @@ struct OEIdIndexInfo {
 enum OECaseType { OECaseSensitive = 0, OECaseInsensitive = 1 };
 
 // Binary search over an index. Compare returns the key minus the element at a position.
+// Its only virtual operations are Compare and Count, in that slot order; search objects live on
+// the stack, so the destructor is protected and not virtual.
 class OE_API OEBinarySearch {
 public:
     enum : unsigned short { kNotFound = 0xFFFF };
-    virtual ~OEBinarySearch() {}
     virtual int Compare(unsigned short position) = 0;
     virtual unsigned short Count() = 0;
     // The position of the key, or kNotFound. Signed 16-bit bounds: at most 32767 entries.
     unsigned short Search();
+
+protected:
+    ~OEBinarySearch() = default;
 };
 
 class OE_API SearchDictionaryEntry : public OEBinarySearch {

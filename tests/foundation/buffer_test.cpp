@@ -64,6 +64,33 @@ TEST(OEBuffer, WriteLargeInPieces) {
     EXPECT_NE(small.GetSmallBufferPtr(), nullptr);
 }
 
+TEST(OEBuffer, WritesOfItsOwnBytesSurviveGrowth) {
+    OEBuffer b(4, 4);
+    b.WriteString("abcd");
+    EXPECT_EQ(b.Write(&b), OEBR_SUCCESS); // the whole buffer appended to itself
+    EXPECT_EQ(std::string(b.GetBufferPtr(), b.GetBufferSize()), "abcdabcd");
+    EXPECT_EQ(b.Write(b.GetBufferPtr() + 1, 3), OEBR_SUCCESS); // grows: the source block moves
+    EXPECT_EQ(std::string(b.GetBufferPtr(), b.GetBufferSize()), "abcdabcdbcd");
+    std::string big(20000, 'q');
+    b.WriteString(big.c_str());
+    unsigned long size = b.GetBufferSize();
+    EXPECT_EQ(b.WriteLarge(b.GetBufferPtr(), size), OEBR_SUCCESS); // in pieces, each growing
+    EXPECT_EQ(b.GetBufferSize(), 2 * size);
+    EXPECT_EQ(std::string(b.GetBufferPtr() + size, size), std::string(b.GetBufferPtr(), size));
+}
+
+TEST(OEBuffer, OffsetFarBeyondTheDataDoesNotWrap) {
+    OEBuffer b;
+    b.WriteString("abc");
+    b.SetBufferOffset(0xFFFFFFFFul); // offset + count passes 32 bits
+    char out[4] = {};
+    unsigned short got = 9;
+    EXPECT_EQ(b.Write("xy", 2), OEBR_BEYONDEND);
+    EXPECT_EQ(b.Read(out, got, 2), OEBR_BEYONDEND);
+    EXPECT_EQ(got, 0);
+    EXPECT_EQ(b.GetBufferSize(), 3u);
+}
+
 TEST(OEBuffer, GetChOutsideTheDataIsZero) {
     OEBuffer b;
     b.WriteString("xyz");

@@ -103,6 +103,20 @@ TEST(OEDynamicArrayString, CopiesAndSpecLength) {
     EXPECT_EQ(copy.GetString(2), nullptr);
 }
 
+TEST(OEDynamicArrayString, GapsLeftByAStorePastTheEnd) {
+    OEDynamicArrayStringLen list(4);
+    ASSERT_EQ(list.Set(2, new OEString("c")), 1); // entries 0 and 1 stay null
+    list.SetSpecLength(1);
+    OEDynamicArrayString copy;
+    EXPECT_EQ(copy.DeepCopyFrom(list), 1);
+    ASSERT_EQ(copy.Entries(), 3);
+    EXPECT_EQ(copy.GetString(0), nullptr);
+    EXPECT_EQ(list.SetString(0, "a"), 1);
+    ASSERT_NE(list.GetString(0), nullptr);
+    EXPECT_STREQ(*list.GetString(0), "a");
+    EXPECT_EQ(list.GetString(0)->SpecLength(), 1);
+}
+
 TEST(OEDynamicArrayString, AllocationFailureFailsTheStore) {
     OEThreadState::SetErrorCode(0);
     OEDynamicArrayString list(1, 1);

@@ -26,6 +26,9 @@ TEST(OEString, BoundedStringsCarryTheirSpecLength) {
     OEString32 fromPlain(OEString("abc"));
     EXPECT_EQ(fromPlain.SpecLength(), 32);
     EXPECT_STREQ(fromPlain, "abc");
+    OEMultiLenString fromBounded(OEString12("abc")); // the class's limit, not the source's
+    EXPECT_EQ(fromBounded.SpecLength(), 65535);
+    EXPECT_STREQ(fromBounded, "abc");
 }
 
 TEST(OEString, SpecLengthIsNotEnforcedOnAssignment) {

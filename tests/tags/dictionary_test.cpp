@@ -6,6 +6,7 @@
 #include <cstring>
 #include <set>
 #include <string>
+#include <type_traits>
 
 TEST(TagTable, CountIdsAndNames) {
     const OETagDictionaryEntry* table = GetOETagDictionary();
@@ -106,7 +107,18 @@ TEST(TagDictionary, CustomTablesChooseTheirLookupMode) {
     EXPECT_EQ(id, 11u);
     TagDictionary none(nullptr, 0);
     EXPECT_EQ(none.GetTagID("A", 1, &id, OECaseSensitive), nullptr);
+
+    OEMemory::FailureHook old = OEMemory::SetFailureHook([](std::size_t) { return 1; });
+    TagDictionary noIndex(dense, 3); // unusable, but an id lookup must not crash
+    OEMemory::SetFailureHook(old);
+    EXPECT_FALSE(noIndex.IsUsable());
+    EXPECT_EQ(noIndex.GetTagID("A", 1, &id, OECaseSensitive), nullptr);
+    EXPECT_STREQ(noIndex.GetTagString(static_cast<OETagID>(11)), "BB");
+    OEThreadState::SetErrorCode(0);
 }
+
+// Compare and Count are the search object's first two slots: no virtual destructor before them.
+static_assert(!std::has_virtual_destructor<OEBinarySearch>::value, "OEBinarySearch slot order");
 
 TEST(TagDictionary, NameOrderIsLengthFirst) {
     OECompareInfo a{nullptr, 0}, b{nullptr, 0};
@@ -131,6 +143,12 @@ TEST(TagDictionary, DestroyAndRebuild) {
     OETagDictionary* second = OETagDictionary::TheOETagDictionary();
     ASSERT_NE(second, nullptr);
     EXPECT_STREQ(second->GetTagString(OETAG_STMTTRNRS), "STMTTRNRS");
+    {
+        OETagDictionary local; // the end of any dictionary clears the singleton pointer
+    }
+    EXPECT_EQ(OETagDictionary::ms_theOETagDictionary.load(), nullptr);
+    OETagDictionary::Destroy(second);
+    ASSERT_NE(OETagDictionary::TheOETagDictionary(), nullptr);
 }
 
 TEST(TagDictionary, EveryNameFindsItsOwnRowInBothCaseModes) {
