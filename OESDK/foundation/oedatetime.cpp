@@ -95,6 +95,11 @@ char* PutSigned(char* p, int v) {
     return PutUnsigned(p, static_cast<unsigned>(v), 1);
 }
 
+// "%02d": at least two characters, the sign included (5 is 05, -5 is -5, -50 is -50).
+char* PutSigned2(char* p, int v) {
+    return v < 0 ? PutSigned(p, v) : PutUnsigned(p, static_cast<unsigned>(v), 2);
+}
+
 char* PutName(char* p, const OEString3& name) {
     for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
     return p;
@@ -388,8 +393,10 @@ unsigned short OEDateTimeBase::GetTimeString(OEString& out) const {
         *p++ = '[';
         p = PutSigned(p, m_tzHours);
         if (m_tzFraction) {
+            // The fraction keeps its sign here ([-3.-50]); only the date form writes its
+            // absolute value. Kept so.
             *p++ = '.';
-            p = PutUnsigned(p, static_cast<unsigned>(m_tzFraction < 0 ? -m_tzFraction : m_tzFraction), 2);
+            p = PutSigned2(p, m_tzFraction);
         }
         if (!m_tzName.IsEmpty()) {
             *p++ = ':';

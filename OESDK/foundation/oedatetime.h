@@ -26,7 +26,8 @@ public:
 
     // Parses a date-time (here and in OEDateTime) or a time (OETime); failures are logged.
     virtual OEDateTimeBase& operator=(const char* text);
-    // Time form: HHMMSS[.ms][[zone[:name]]] (milliseconds not padded). 1, or 0 when invalid.
+    // Time form: HHMMSS[.ms][[zone[.fraction][:name]]], milliseconds not padded, the fraction with
+    // its sign; the zone only when its hours are not 0 (else ":name" alone). 1, or 0 when invalid.
     virtual unsigned short GetTimeString(OEString& out) const;
     virtual unsigned short IsValidTime() const;
     // Date form: YYYYMMDD[HHMMSS[.XXX][[zone[:name]]]]. 1, or 0 (out untouched) when invalid.
