@@ -468,7 +468,9 @@ unsigned short OEDateTimeBase::AssignSeconds(long long seconds) {
 }
 
 unsigned short OEDateTimeBase::FromPrecInt(const OEPrecisionInteger& seconds) {
-    if (!seconds.IsValid()) return 0;
+    // Below three decimals the rescale multiplies: a magnitude past 63 bits could wrap to a
+    // plausible count, so it is refused first.
+    if (!seconds.IsValid() || (seconds.Decimal() < 3 && !seconds.FitInASInt64())) return 0;
     OEPrecisionInteger ms(seconds);
     ms.Decimal(3);
     if (!ms.FitInASInt64()) return 0;

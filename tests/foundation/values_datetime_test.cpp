@@ -227,6 +227,9 @@ TEST_F(ValuesDateTime, SecondsSince1970) {
     EXPECT_EQ("20240131170000.250", DateText(p));
     p = OEPrecisionInteger("-0.5");
     EXPECT_EQ("19691231235959.500", DateText(p));
+    // 2^93 + 1 seconds: times 1000 it would wrap to 1000 (1970-01-01 00:00:01).
+    EXPECT_EQ(0, p.FromPrecInt(OEPrecisionInteger("9903520314283042199192993793")));
+    EXPECT_EQ("19691231235959.500", DateText(p));
 }
 
 TEST_F(ValuesDateTime, ZoneConversionsAndAddition) {
