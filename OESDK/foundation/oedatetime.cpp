@@ -497,7 +497,10 @@ unsigned short OEDateTimeBase::ConvertToLocalTime(short hours, short fraction) {
 OEDateTimeBase& OEDateTimeBase::operator+=(long long seconds) {
     // A date before 1902 has no count of seconds; it is left as it is.
     if (m_year < 1902) return *this;
-    if (AssignSeconds(GetTimeT() + seconds)) m_tzName = "";
+    const long long t = GetTimeT();
+    // A sum outside what AssignSeconds takes is refused before it can overflow.
+    if (seconds > kMaxSeconds - t || seconds < kMinSeconds - t) return *this;
+    if (AssignSeconds(t + seconds)) m_tzName.Truncate(0);
     return *this;
 }
 

@@ -263,6 +263,13 @@ TEST_F(ValuesDateTime, ZoneConversionsAndAddition) {
     EXPECT_EQ("20240301", DateText(c));
     c += -86400LL * 366;
     EXPECT_EQ("20230301", DateText(c));
+    for (long long huge :
+         {9223372036854775807LL, -9223372036854775807LL - 1, 32535215999LL - 1677628800LL + 1}) {
+        c += huge; // refused, whatever the size: no overflow, no change
+        EXPECT_EQ("20230301", DateText(c));
+    }
+    c += OEPrecisionInteger("9223372036854775807");
+    EXPECT_EQ("20230301", DateText(c));
 }
 
 TEST_F(ValuesDateTime, OrderingAcrossZones) {
