@@ -267,6 +267,10 @@ unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* who
     if (fracDigits == 1) frac *= 10; // one digit counts as tenths of an hour
     if (StoreTimeZone(name, static_cast<short>(sign * hours), static_cast<short>(sign * frac)))
         pending |= kZoneNameMismatch;
+    if (nameLen && m_tzName.IsEmpty()) { // no memory for the name
+        Warn(OEPW_NULLPOINTER, whole, kCtxTime);
+        return 0;
+    }
     return 1;
 }
 

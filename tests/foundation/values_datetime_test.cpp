@@ -1,6 +1,7 @@
 // OEDateTime, OETime and OEPayrollDateTime: parsing with its warnings, both text forms, seconds
 // since 1970, zones and ordering. Runs under several TZ settings (tests.cmake): no expectation
 // here may depend on the machine's zone.
+#include "alloc_failure.h"
 #include "values_testlog.h"
 
 #include <cstdlib>
@@ -122,6 +123,13 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
     EXPECT_STREQ("CDT", zone.GetTimeZone());
     EXPECT_EQ(1, zone.SetTimeZone("MDT", -6, 0));
     EXPECT_TRUE(log.None());
+    {
+        OEDateTime named;
+        FailAllocations noMemory;
+        EXPECT_EQ(0, named.ConvertStringToOEDateTime("20240131[-5:EST]"));
+    }
+    EXPECT_TRUE(log.ExactlyOne(OEPW_NULLPOINTER, "20240131[-5:EST]", kTM));
+    OEThreadState::SetErrorCode(OETE_NONE);
     OEDateTime n("20240131[-3.5]");
     EXPECT_EQ(-3, n.GetTimeZoneHours());
     EXPECT_EQ(-50, n.GetTimeZoneFraction());
