@@ -115,6 +115,14 @@ OEDateTimeBase::OEDateTimeBase()
     : m_year(0), m_month(0), m_day(0), m_hour(0), m_minute(0), m_second(0), m_millisecond(0), m_tzHours(0),
       m_tzFraction(0), m_binary(nullptr) {}
 
+OEDateTimeBase::OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
+                               short millisecond, short tzHours, short tzFraction)
+    : m_year(static_cast<unsigned short>(year)), m_month(static_cast<unsigned short>(month)),
+      m_day(static_cast<unsigned short>(day)), m_hour(static_cast<unsigned short>(hour)),
+      m_minute(static_cast<unsigned short>(minute)), m_second(static_cast<unsigned short>(second)),
+      m_millisecond(static_cast<unsigned short>(millisecond)), m_tzHours(tzHours), m_tzFraction(tzFraction),
+      m_binary(nullptr) {}
+
 OEDateTimeBase::OEDateTimeBase(const OEDateTimeBase& other)
     : m_year(other.m_year), m_month(other.m_month), m_day(other.m_day), m_hour(other.m_hour),
       m_minute(other.m_minute), m_second(other.m_second), m_millisecond(other.m_millisecond),
@@ -603,17 +611,8 @@ void OEDateTimeBase::UnLockBuffer() {
 // --- OEDateTime, OETime -------------------------------------------------------------------
 
 OEDateTime::OEDateTime(short year, short month, short day, short hour, short minute, short second,
-                       short millisecond, short tzHours, short tzFraction) {
-    m_year = static_cast<unsigned short>(year);
-    m_month = static_cast<unsigned short>(month);
-    m_day = static_cast<unsigned short>(day);
-    m_hour = static_cast<unsigned short>(hour);
-    m_minute = static_cast<unsigned short>(minute);
-    m_second = static_cast<unsigned short>(second);
-    m_millisecond = static_cast<unsigned short>(millisecond);
-    m_tzHours = tzHours;
-    m_tzFraction = tzFraction;
-}
+                       short millisecond, short tzHours, short tzFraction)
+    : OEDateTimeBase(year, month, day, hour, minute, second, millisecond, tzHours, tzFraction) {}
 
 OEDateTime::OEDateTime(const char* text) {
     ConvertStringToOEDateTime(text);
@@ -634,17 +633,8 @@ OEDateTime OEDateTime::TimeBetween(const OEDateTimeBase&) const {
 }
 
 OETime::OETime(short year, short month, short day, short hour, short minute, short second, short millisecond,
-               short tzHours, short tzFraction) {
-    m_year = static_cast<unsigned short>(year);
-    m_month = static_cast<unsigned short>(month);
-    m_day = static_cast<unsigned short>(day);
-    m_hour = static_cast<unsigned short>(hour);
-    m_minute = static_cast<unsigned short>(minute);
-    m_second = static_cast<unsigned short>(second);
-    m_millisecond = static_cast<unsigned short>(millisecond);
-    m_tzHours = tzHours;
-    m_tzFraction = tzFraction;
-}
+               short tzHours, short tzFraction)
+    : OEDateTimeBase(year, month, day, hour, minute, second, millisecond, tzHours, tzFraction) {}
 
 OETime::OETime(const char* text) {
     ConvertStringToOETime(text);

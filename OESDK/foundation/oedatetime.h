@@ -104,6 +104,9 @@ public:
     void UnLockBuffer();
 
 protected:
+    // The fields as given, name empty, nothing validated (OEDateTime, OETime).
+    OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
+                   short millisecond, short tzHours, short tzFraction);
     // Irregularities of a zone that do not fail the parse; they are logged only once the whole
     // conversion has succeeded, so a failed conversion logs exactly its one failure.
     enum : unsigned { kZoneIrregular = 1, kZoneNameMismatch = 2 };
