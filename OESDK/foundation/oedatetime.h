@@ -192,6 +192,16 @@ public:
 
     OEPayrollDateTime& operator=(const char* text) override;
     OEPayrollDateTime& operator=(const OEPayrollDateTime& other);
+    // Seconds since 1970 (universal time) or a number of seconds, as in OEDateTime; a successful
+    // assignment clears the empty flag.
+    OEPayrollDateTime& operator=(long long seconds) {
+        if (AssignSeconds(seconds)) m_empty = 0;
+        return *this;
+    }
+    OEPayrollDateTime& operator=(const OEPrecisionInteger& seconds) {
+        if (FromPrecInt(seconds)) m_empty = 0;
+        return *this;
+    }
     unsigned short GetDateString(OEString& out) const override;
 
     // Sets or clears the empty flag; the other fields are left alone.

@@ -374,6 +374,10 @@ TEST_F(ValuesDateTime, PayrollDateTime) {
     OEPayrollDateTime copy;
     copy = p;
     EXPECT_EQ(1, copy.IsEmpty());
+    copy = 86400LL; // from seconds, as any date-time: no longer empty
+    EXPECT_EQ("19700102", DateText(copy));
+    p = OEPrecisionInteger("0.5");
+    EXPECT_EQ("19700101000000.500", DateText(p));
     EXPECT_TRUE(log.None());
 }
 
