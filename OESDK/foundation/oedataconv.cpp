@@ -1,5 +1,6 @@
 #include "foundation/oedataconv.h"
 
+#include "foundation/oekeywordpair.h"
 #include "foundation/oeparsewarning.h"
 
 #include <cstdio>
@@ -212,434 +213,169 @@ unsigned short OEDataConversion::StringToLanguage(const char* text, OELanguage& 
 
 const char* const kAssetClassTable[] = {"DOMESTICBOND", "INTLBOND",  "LARGESTOCK", "SMALLSTOCK",
                                         "INTLSTOCK",    "MONEYMRKT", "OTHER"};
-unsigned short OEDataConversion::AssetClassToString(OEAssetClass value, OEString& out) {
-    return KeywordToString(value, out, 0, 6, kAssetClassTable);
-}
-unsigned short OEDataConversion::StringToAssetClass(const char* text, OEAssetClass& value) {
-    return KeywordToEnum(text, value, 0, 6, kAssetClassTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, AssetClass, OEAssetClass, 0, kAssetClassTable)
 
 const char* const kBalTypeTable[] = {"DOLLAR", "PERCENT", "NUMBER"};
-unsigned short OEDataConversion::BalTypeToString(OEBalType value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kBalTypeTable);
-}
-unsigned short OEDataConversion::StringToBalType(const char* text, OEBalType& value) {
-    return KeywordToEnum(text, value, 0, 2, kBalTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BalType, OEBalType, 0, kBalTypeTable)
 
 const char* const kBankAccountTable[] = {"UNKNOWN", "CHECKING",  "SAVINGS",
                                          "CREDIT",  "MONEYMRKT", "CREDITLINE"};
-unsigned short OEDataConversion::BankAccountToString(OEBankAccountType value, OEString& out) {
-    return KeywordToString(value, out, 0, 5, kBankAccountTable);
-}
-unsigned short OEDataConversion::StringToBankAccount(const char* text, OEBankAccountType& value) {
-    return KeywordToEnum(text, value, 0, 5, kBankAccountTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BankAccount, OEBankAccountType, 0, kBankAccountTable)
 
 const char* const kBankAccount2Table[] = {"CHECKING", "SAVINGS", "MONEYMRKT", "CREDITLINE", "CMA"};
-unsigned short OEDataConversion::BankAccount2ToString(OEBankAccountType2 value, OEString& out) {
-    return KeywordToString(value, out, 0, 4, kBankAccount2Table);
-}
-unsigned short OEDataConversion::StringToBankAccount2(const char* text, OEBankAccountType2& value) {
-    return KeywordToEnum(text, value, 0, 4, kBankAccount2Table);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BankAccount2, OEBankAccountType2, 0, kBankAccount2Table)
 
 const char* const kBankActionTable[] = {"REPLACE", "DELETE"};
-unsigned short OEDataConversion::BankActionToString(OEBankAction value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kBankActionTable);
-}
-unsigned short OEDataConversion::StringToBankAction(const char* text, OEBankAction& value) {
-    return KeywordToEnum(text, value, 0, 1, kBankActionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BankAction, OEBankAction, 0, kBankActionTable)
 
 const char* const kBankTxTable[] = {"CREDIT", "DEBIT",     "INT",         "DIV",       "FEE",   "SRVCHG",
                                     "DEP",    "ATM",       "POS",         "XFER",      "CHECK", "PAYMENT",
                                     "CASH",   "DIRECTDEP", "DIRECTDEBIT", "REPEATPMT", "OTHER"};
-unsigned short OEDataConversion::BankTxToString(OEBankTxType value, OEString& out) {
-    return KeywordToString(value, out, 0, 16, kBankTxTable);
-}
-unsigned short OEDataConversion::StringToBankTx(const char* text, OEBankTxType& value) {
-    return KeywordToEnum(text, value, 0, 16, kBankTxTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BankTx, OEBankTxType, 0, kBankTxTable)
 
 const char* const kBuyTypeTable[] = {"BUY", "BUYTOCOVER"};
-unsigned short OEDataConversion::BuyTypeToString(OEBuyType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kBuyTypeTable);
-}
-unsigned short OEDataConversion::StringToBuyType(const char* text, OEBuyType& value) {
-    return KeywordToEnum(text, value, 0, 1, kBuyTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, BuyType, OEBuyType, 0, kBuyTypeTable)
 
 const char* const kCallTypeTable[] = {"CALL", "PUT", "PREFUND", "MATURITY"};
-unsigned short OEDataConversion::CallTypeToString(OECallType value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kCallTypeTable);
-}
-unsigned short OEDataConversion::StringToCallType(const char* text, OECallType& value) {
-    return KeywordToEnum(text, value, 0, 3, kCallTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, CallType, OECallType, 0, kCallTypeTable)
 
 const char* const kCharacterTypeTable[] = {"ALPHAONLY", "NUMERICONLY", "ALPHAORNUMERIC", "ALPHAANDNUMERIC"};
-unsigned short OEDataConversion::CharacterTypeToString(OECharacterType value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kCharacterTypeTable);
-}
-unsigned short OEDataConversion::StringToCharacterType(const char* text, OECharacterType& value) {
-    return KeywordToEnum(text, value, 0, 3, kCharacterTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, CharacterType, OECharacterType, 0, kCharacterTypeTable)
 
 const char* const kClientRoutingTable[] = {"NONE", "SERVICE", "MSGSET"};
-unsigned short OEDataConversion::ClientRoutingToString(OEClientRouting value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kClientRoutingTable);
-}
-unsigned short OEDataConversion::StringToClientRouting(const char* text, OEClientRouting& value) {
-    return KeywordToEnum(text, value, 0, 2, kClientRoutingTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, ClientRouting, OEClientRouting, 0, kClientRoutingTable)
 
 const char* const kCouponFreqTable[] = {"MONTHLY", "QUARTERLY", "SEMIANNUAL", "ANNUAL", "OTHER"};
-unsigned short OEDataConversion::CouponFreqToString(OECouponFreq value, OEString& out) {
-    return KeywordToString(value, out, 0, 4, kCouponFreqTable);
-}
-unsigned short OEDataConversion::StringToCouponFreq(const char* text, OECouponFreq& value) {
-    return KeywordToEnum(text, value, 0, 4, kCouponFreqTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, CouponFreq, OECouponFreq, 0, kCouponFreqTable)
 
 const char* const kDayOfWeekTable[] = {"MONDAY", "TUESDAY",  "WEDNESDAY", "THURSDAY",
                                        "FRIDAY", "SATURDAY", "SUNDAY"};
-unsigned short OEDataConversion::DayOfWeekToString(OEDayOfWeek value, OEString& out) {
-    return KeywordToString(value, out, 0, 6, kDayOfWeekTable);
-}
-unsigned short OEDataConversion::StringToDayOfWeek(const char* text, OEDayOfWeek& value) {
-    return KeywordToEnum(text, value, 0, 6, kDayOfWeekTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, DayOfWeek, OEDayOfWeek, 0, kDayOfWeekTable)
 
 const char* const kDebtActionTable[] = {"CALLED", "MATURED"};
-unsigned short OEDataConversion::DebtActionToString(OEDebtAction value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kDebtActionTable);
-}
-unsigned short OEDataConversion::StringToDebtAction(const char* text, OEDebtAction& value) {
-    return KeywordToEnum(text, value, 0, 1, kDebtActionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, DebtAction, OEDebtAction, 0, kDebtActionTable)
 
 const char* const kDebtClassTable[] = {"TREASURY", "MUNICIPAL", "CORPORATE", "OTHER"};
-unsigned short OEDataConversion::DebtClassToString(OEDebtClass value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kDebtClassTable);
-}
-unsigned short OEDataConversion::StringToDebtClass(const char* text, OEDebtClass& value) {
-    return KeywordToEnum(text, value, 0, 3, kDebtClassTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, DebtClass, OEDebtClass, 0, kDebtClassTable)
 
 const char* const kDebtTypeTable[] = {"COUPON", "ZERO"};
-unsigned short OEDataConversion::DebtTypeToString(OEDebtType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kDebtTypeTable);
-}
-unsigned short OEDataConversion::StringToDebtType(const char* text, OEDebtType& value) {
-    return KeywordToEnum(text, value, 0, 1, kDebtTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, DebtType, OEDebtType, 0, kDebtTypeTable)
 
 const char* const kDurationTable[] = {"DAY", "GOODTILCANCEL", "IMMEDIATE"};
-unsigned short OEDataConversion::DurationToString(OEDuration value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kDurationTable);
-}
-unsigned short OEDataConversion::StringToDuration(const char* text, OEDuration& value) {
-    return KeywordToEnum(text, value, 0, 2, kDurationTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Duration, OEDuration, 0, kDurationTable)
 
 const char* const kExtdPmtForTable[] = {"INDIVIDUAL", "BUSINESS"};
-unsigned short OEDataConversion::ExtdPmtForToString(OEExtdPmtFor value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kExtdPmtForTable);
-}
-unsigned short OEDataConversion::StringToExtdPmtFor(const char* text, OEExtdPmtFor& value) {
-    return KeywordToEnum(text, value, 0, 1, kExtdPmtForTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, ExtdPmtFor, OEExtdPmtFor, 0, kExtdPmtForTable)
 
 const char* const kFidelityOptBuyTypeTable[] = {"BUY"};
-unsigned short OEDataConversion::FidelityOptBuyTypeToString(OEFidelityOptBuyType value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kFidelityOptBuyTypeTable);
-}
-unsigned short OEDataConversion::StringToFidelityOptBuyType(const char* text, OEFidelityOptBuyType& value) {
-    return KeywordToEnum(text, value, 0, 0, kFidelityOptBuyTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, FidelityOptBuyType, OEFidelityOptBuyType, 0, kFidelityOptBuyTypeTable)
 
 const char* const kFidelityOptSellTypeTable[] = {"SELL"};
-unsigned short OEDataConversion::FidelityOptSellTypeToString(OEFidelityOptSellType value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kFidelityOptSellTypeTable);
-}
-unsigned short OEDataConversion::StringToFidelityOptSellType(const char* text, OEFidelityOptSellType& value) {
-    return KeywordToEnum(text, value, 0, 0, kFidelityOptSellTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, FidelityOptSellType, OEFidelityOptSellType, 0, kFidelityOptSellTypeTable)
 
 const char* const kFrequencyTable[] = {"WEEKLY",    "BIWEEKLY",  "TWICEMONTHLY", "MONTHLY", "FOURWEEKS",
                                        "BIMONTHLY", "QUARTERLY", "SEMIANNUALLY", "ANNUALLY"};
-unsigned short OEDataConversion::FrequencyToString(OEFrequency value, OEString& out) {
-    return KeywordToString(value, out, 0, 8, kFrequencyTable);
-}
-unsigned short OEDataConversion::StringToFrequency(const char* text, OEFrequency& value) {
-    return KeywordToEnum(text, value, 0, 8, kFrequencyTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Frequency, OEFrequency, 0, kFrequencyTable)
 
 const char* const kHeaderTagTable[] = {"",          "",         "OFXHEADER", "DATA",        "VERSION",
                                        "SECURITY",  "ENCODING", "CHARSET",   "COMPRESSION", "OLDFILEUID",
                                        "NEWFILEUID"};
-unsigned short OEDataConversion::HeaderTagToString(OEHeaderTag value, OEString& out) {
-    return KeywordToString(value, out, 2, 10, kHeaderTagTable);
-}
-unsigned short OEDataConversion::StringToHeaderTag(const char* text, OEHeaderTag& value) {
-    return KeywordToEnum(text, value, 2, 10, kHeaderTagTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, HeaderTag, OEHeaderTag, 2, kHeaderTagTable)
 
 const char* const kIncomeTypeTable[] = {"CGLONG", "CGSHORT", "DIV", "INTEREST", "MISC"};
-unsigned short OEDataConversion::IncomeTypeToString(OEIncomeType value, OEString& out) {
-    return KeywordToString(value, out, 0, 4, kIncomeTypeTable);
-}
-unsigned short OEDataConversion::StringToIncomeType(const char* text, OEIncomeType& value) {
-    return KeywordToEnum(text, value, 0, 4, kIncomeTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, IncomeType, OEIncomeType, 0, kIncomeTypeTable)
 
 const char* const kInvAcctTypeTable[] = {"INDIVIDUAL", "JOINT", "TRUST", "CORPORATE"};
-unsigned short OEDataConversion::InvAcctTypeToString(OEInvAcctType value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kInvAcctTypeTable);
-}
-unsigned short OEDataConversion::StringToInvAcctType(const char* text, OEInvAcctType& value) {
-    return KeywordToEnum(text, value, 0, 3, kInvAcctTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, InvAcctType, OEInvAcctType, 0, kInvAcctTypeTable)
 
 const char* const kMFTypeTable[] = {"OPENEND", "CLOSEEND", "OTHER"};
-unsigned short OEDataConversion::MFTypeToString(OEMFType value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kMFTypeTable);
-}
-unsigned short OEDataConversion::StringToMFType(const char* text, OEMFType& value) {
-    return KeywordToEnum(text, value, 0, 2, kMFTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, MFType, OEMFType, 0, kMFTypeTable)
 
 const char* const kOFXCharSetTable[] = {"1252"};
-unsigned short OEDataConversion::OFXCharSetToString(OEOFXCharSet value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kOFXCharSetTable);
-}
-unsigned short OEDataConversion::StringToOFXCharSet(const char* text, OEOFXCharSet& value) {
-    return KeywordToEnum(text, value, 0, 0, kOFXCharSetTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXCharSet, OEOFXCharSet, 0, kOFXCharSetTable)
 
 const char* const kOFXCompressionTable[] = {"NONE"};
-unsigned short OEDataConversion::OFXCompressionToString(OEOFXCompression value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kOFXCompressionTable);
-}
-unsigned short OEDataConversion::StringToOFXCompression(const char* text, OEOFXCompression& value) {
-    return KeywordToEnum(text, value, 0, 0, kOFXCompressionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXCompression, OEOFXCompression, 0, kOFXCompressionTable)
 
 const char* const kOFXDataTable[] = {"OFXSGML"};
-unsigned short OEDataConversion::OFXDataToString(OEOFXData value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kOFXDataTable);
-}
-unsigned short OEDataConversion::StringToOFXData(const char* text, OEOFXData& value) {
-    return KeywordToEnum(text, value, 0, 0, kOFXDataTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXData, OEOFXData, 0, kOFXDataTable)
 
 const char* const kOFXEncodingTable[] = {"USASCII", "UTF-8"};
-unsigned short OEDataConversion::OFXEncodingToString(OEOFXEncoding value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kOFXEncodingTable);
-}
-unsigned short OEDataConversion::StringToOFXEncoding(const char* text, OEOFXEncoding& value) {
-    return KeywordToEnum(text, value, 0, 1, kOFXEncodingTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXEncoding, OEOFXEncoding, 0, kOFXEncodingTable)
 
 const char* const kOFXFileUIDTable[] = {"NONE"};
-unsigned short OEDataConversion::OFXFileUIDToString(OEOFXFileUID value, OEString& out) {
-    return KeywordToString(value, out, 0, 0, kOFXFileUIDTable);
-}
-unsigned short OEDataConversion::StringToOFXFileUID(const char* text, OEOFXFileUID& value) {
-    return KeywordToEnum(text, value, 0, 0, kOFXFileUIDTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXFileUID, OEOFXFileUID, 0, kOFXFileUIDTable)
 
 const char* const kOFXSecurityTable[] = {"NONE", "TYPE1"};
-unsigned short OEDataConversion::OFXSecurityToString(OEOFXSecurity value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kOFXSecurityTable);
-}
-unsigned short OEDataConversion::StringToOFXSecurity(const char* text, OEOFXSecurity& value) {
-    return KeywordToEnum(text, value, 0, 1, kOFXSecurityTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OFXSecurity, OEOFXSecurity, 0, kOFXSecurityTable)
 
 const char* const kOptActionTable[] = {"EXERCISE", "ASSIGN", "EXPIRE"};
-unsigned short OEDataConversion::OptActionToString(OEOptAction value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kOptActionTable);
-}
-unsigned short OEDataConversion::StringToOptAction(const char* text, OEOptAction& value) {
-    return KeywordToEnum(text, value, 0, 2, kOptActionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OptAction, OEOptAction, 0, kOptActionTable)
 
 const char* const kOptBuyTypeTable[] = {"BUYTOOPEN", "BUYTOCLOSE"};
-unsigned short OEDataConversion::OptBuyTypeToString(OEOptBuyType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kOptBuyTypeTable);
-}
-unsigned short OEDataConversion::StringToOptBuyType(const char* text, OEOptBuyType& value) {
-    return KeywordToEnum(text, value, 0, 1, kOptBuyTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OptBuyType, OEOptBuyType, 0, kOptBuyTypeTable)
 
 const char* const kOptSellTypeTable[] = {"SELLTOOPEN", "SELLTOCLOSE"};
-unsigned short OEDataConversion::OptSellTypeToString(OEOptSellType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kOptSellTypeTable);
-}
-unsigned short OEDataConversion::StringToOptSellType(const char* text, OEOptSellType& value) {
-    return KeywordToEnum(text, value, 0, 1, kOptSellTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OptSellType, OEOptSellType, 0, kOptSellTypeTable)
 
 const char* const kOptTypeTable[] = {"PUT", "CALL", "OTHER"};
-unsigned short OEDataConversion::OptTypeToString(OEOptType value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kOptTypeTable);
-}
-unsigned short OEDataConversion::StringToOptType(const char* text, OEOptType& value) {
-    return KeywordToEnum(text, value, 0, 2, kOptTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, OptType, OEOptType, 0, kOptTypeTable)
 
 const char* const kPayeeIDScopeTable[] = {"GLOBAL", "USER"};
-unsigned short OEDataConversion::PayeeIDScopeToString(OEPayeeIDScope value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kPayeeIDScopeTable);
-}
-unsigned short OEDataConversion::StringToPayeeIDScope(const char* text, OEPayeeIDScope& value) {
-    return KeywordToEnum(text, value, 0, 1, kPayeeIDScopeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, PayeeIDScope, OEPayeeIDScope, 0, kPayeeIDScopeTable)
 
 const char* const kPosTypeTable[] = {"LONG", "SHORT"};
-unsigned short OEDataConversion::PosTypeToString(OEPosType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kPosTypeTable);
-}
-unsigned short OEDataConversion::StringToPosType(const char* text, OEPosType& value) {
-    return KeywordToEnum(text, value, 0, 1, kPosTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, PosType, OEPosType, 0, kPosTypeTable)
 
 const char* const kProcCodeTable[] = {"WILLPROCESSON", "POSTEDON", "PROCESSEDON",
                                       "NOFUNDSON",     "FAILEDON", "CANCELEDON"};
-unsigned short OEDataConversion::ProcCodeToString(OEProcCode value, OEString& out) {
-    return KeywordToString(value, out, 0, 5, kProcCodeTable);
-}
-unsigned short OEDataConversion::StringToProcCode(const char* text, OEProcCode& value) {
-    return KeywordToEnum(text, value, 0, 5, kProcCodeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, ProcCode, OEProcCode, 0, kProcCodeTable)
 
 const char* const kRelTypeTable[] = {"SPREAD", "STRADDLE", "NONE", "OTHER"};
-unsigned short OEDataConversion::RelTypeToString(OERelType value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kRelTypeTable);
-}
-unsigned short OEDataConversion::StringToRelType(const char* text, OERelType& value) {
-    return KeywordToEnum(text, value, 0, 3, kRelTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, RelType, OERelType, 0, kRelTypeTable)
 
 const char* const kRestrictionTable[] = {"ALLORNONE", "MINUNITS", "NONE"};
-unsigned short OEDataConversion::RestrictionToString(OERestriction value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kRestrictionTable);
-}
-unsigned short OEDataConversion::StringToRestriction(const char* text, OERestriction& value) {
-    return KeywordToEnum(text, value, 0, 2, kRestrictionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Restriction, OERestriction, 0, kRestrictionTable)
 
 const char* const kSecuredTable[] = {"NAKED", "COVERED"};
-unsigned short OEDataConversion::SecuredToString(OESecured value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kSecuredTable);
-}
-unsigned short OEDataConversion::StringToSecured(const char* text, OESecured& value) {
-    return KeywordToEnum(text, value, 0, 1, kSecuredTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Secured, OESecured, 0, kSecuredTable)
 
 const char* const kSellReasonTable[] = {"CALL", "SELL", "MATURITY"};
-unsigned short OEDataConversion::SellReasonToString(OESellReason value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kSellReasonTable);
-}
-unsigned short OEDataConversion::StringToSellReason(const char* text, OESellReason& value) {
-    return KeywordToEnum(text, value, 0, 2, kSellReasonTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, SellReason, OESellReason, 0, kSellReasonTable)
 
 const char* const kSellTypeTable[] = {"SELL", "SELLSHORT"};
-unsigned short OEDataConversion::SellTypeToString(OESellType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kSellTypeTable);
-}
-unsigned short OEDataConversion::StringToSellType(const char* text, OESellType& value) {
-    return KeywordToEnum(text, value, 0, 1, kSellTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, SellType, OESellType, 0, kSellTypeTable)
 
 const char* const kServiceTable[] = {"BANKSVC", "BPSVC", "INVSVC"};
-unsigned short OEDataConversion::ServiceToString(OEService value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kServiceTable);
-}
-unsigned short OEDataConversion::StringToService(const char* text, OEService& value) {
-    return KeywordToEnum(text, value, 0, 2, kServiceTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Service, OEService, 0, kServiceTable)
 
 const char* const kService2Table[] = {"BANKSVC", "BPSVC", "INVSVC", "PRESSVC"};
-unsigned short OEDataConversion::Service2ToString(OEService2 value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kService2Table);
-}
-unsigned short OEDataConversion::StringToService2(const char* text, OEService2& value) {
-    return KeywordToEnum(text, value, 0, 3, kService2Table);
-}
+OE_KEYWORD_PAIR(OEDataConversion, Service2, OEService2, 0, kService2Table)
 
 const char* const kServiceStatusTable[] = {"AVAIL", "PEND", "ACTIVE"};
-unsigned short OEDataConversion::ServiceStatusToString(OEServiceStatus value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kServiceStatusTable);
-}
-unsigned short OEDataConversion::StringToServiceStatus(const char* text, OEServiceStatus& value) {
-    return KeywordToEnum(text, value, 0, 2, kServiceStatusTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, ServiceStatus, OEServiceStatus, 0, kServiceStatusTable)
 
 const char* const kServiceStatus2Table[] = {"AVAIL", "PEND", "ACTIVE", "REJECTED"};
-unsigned short OEDataConversion::ServiceStatus2ToString(OEServiceStatus2 value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kServiceStatus2Table);
-}
-unsigned short OEDataConversion::StringToServiceStatus2(const char* text, OEServiceStatus2& value) {
-    return KeywordToEnum(text, value, 0, 3, kServiceStatus2Table);
-}
+OE_KEYWORD_PAIR(OEDataConversion, ServiceStatus2, OEServiceStatus2, 0, kServiceStatus2Table)
 
 const char* const kStatusSeverityTable[] = {"INFO", "WARN", "ERROR"};
-unsigned short OEDataConversion::StatusSeverityToString(OEStatusSeverity value, OEString& out) {
-    return KeywordToString(value, out, 0, 2, kStatusSeverityTable);
-}
-unsigned short OEDataConversion::StringToStatusSeverity(const char* text, OEStatusSeverity& value) {
-    return KeywordToEnum(text, value, 0, 2, kStatusSeverityTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, StatusSeverity, OEStatusSeverity, 0, kStatusSeverityTable)
 
 const char* const kStockTypeTable[] = {"COMMON", "PREFERRED", "CONVERTIBLE", "OTHER"};
-unsigned short OEDataConversion::StockTypeToString(OEStockType value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kStockTypeTable);
-}
-unsigned short OEDataConversion::StringToStockType(const char* text, OEStockType& value) {
-    return KeywordToEnum(text, value, 0, 3, kStockTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, StockType, OEStockType, 0, kStockTypeTable)
 
 const char* const kSubAcctTable[] = {"CASH", "MARGIN", "SHORT", "OTHER"};
-unsigned short OEDataConversion::SubAcctToString(OESubAcct value, OEString& out) {
-    return KeywordToString(value, out, 0, 3, kSubAcctTable);
-}
-unsigned short OEDataConversion::StringToSubAcct(const char* text, OESubAcct& value) {
-    return KeywordToEnum(text, value, 0, 3, kSubAcctTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, SubAcct, OESubAcct, 0, kSubAcctTable)
 
 const char* const kSyncModeTable[] = {"FULL", "LITE"};
-unsigned short OEDataConversion::SyncModeToString(OESyncMode value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kSyncModeTable);
-}
-unsigned short OEDataConversion::StringToSyncMode(const char* text, OESyncMode& value) {
-    return KeywordToEnum(text, value, 0, 1, kSyncModeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, SyncMode, OESyncMode, 0, kSyncModeTable)
 
 const char* const kTferActionTable[] = {"IN", "OUT"};
-unsigned short OEDataConversion::TferActionToString(OETferAction value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kTferActionTable);
-}
-unsigned short OEDataConversion::StringToTferAction(const char* text, OETferAction& value) {
-    return KeywordToEnum(text, value, 0, 1, kTferActionTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, TferAction, OETferAction, 0, kTferActionTable)
 
 const char* const kUSProductTypeTable[] = {"401K",   "403B",   "IRA", "KEOGH", "OTHER", "SARSEP",
                                            "SIMPLE", "NORMAL", "TDA", "TRUST", "UGMA"};
-unsigned short OEDataConversion::USProductTypeToString(OEUSProductType value, OEString& out) {
-    return KeywordToString(value, out, 0, 10, kUSProductTypeTable);
-}
-unsigned short OEDataConversion::StringToUSProductType(const char* text, OEUSProductType& value) {
-    return KeywordToEnum(text, value, 0, 10, kUSProductTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, USProductType, OEUSProductType, 0, kUSProductTypeTable)
 
 const char* const kUnitTypeTable[] = {"SHARES", "CURRENCY"};
-unsigned short OEDataConversion::UnitTypeToString(OEUnitType value, OEString& out) {
-    return KeywordToString(value, out, 0, 1, kUnitTypeTable);
-}
-unsigned short OEDataConversion::StringToUnitType(const char* text, OEUnitType& value) {
-    return KeywordToEnum(text, value, 0, 1, kUnitTypeTable);
-}
+OE_KEYWORD_PAIR(OEDataConversion, UnitType, OEUnitType, 0, kUnitTypeTable)

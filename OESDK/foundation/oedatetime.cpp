@@ -20,9 +20,9 @@ const char kEmptyMarkerLong[] = "__OFX_EMPTY_STRING__";
 const long long kSecondsPerDay = 86400;
 const long long kFourYears = 126230400; // 1461 days
 // The runtime's 64-bit conversions stop at the end of the year 3000; assignment from seconds
-// refuses what they would refuse, and years before 1.
+// refuses what they would refuse, and whatever lands before the year 1.
 const long long kMaxSeconds = 32535215999LL;
-const long long kMinSeconds = -62135596800LL; // 0001-01-01T00:00:00
+const long long kMinSeconds = -62200000000LL; // a little before the year 1 (checked exactly later)
 
 const unsigned short kDaysPerMonth[12] = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
 
@@ -95,6 +95,11 @@ char* PutSigned(char* p, int v) {
     return PutUnsigned(p, static_cast<unsigned>(v), 1);
 }
 
+// "%02d": at least two characters, the sign included (5 is 05, -5 is -5, -50 is -50).
+char* PutSigned2(char* p, int v) {
+    return v < 0 ? PutSigned(p, v) : PutUnsigned(p, static_cast<unsigned>(v), 2);
+}
+
 char* PutName(char* p, const OEString3& name) {
     for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
     return p;
@@ -109,6 +114,14 @@ void Warn(OEParseWarning code, const char* value, const char* context) {
 OEDateTimeBase::OEDateTimeBase()
     : m_year(0), m_month(0), m_day(0), m_hour(0), m_minute(0), m_second(0), m_millisecond(0), m_tzHours(0),
       m_tzFraction(0), m_binary(nullptr) {}
+
+OEDateTimeBase::OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
+                               short millisecond, short tzHours, short tzFraction)
+    : m_year(static_cast<unsigned short>(year)), m_month(static_cast<unsigned short>(month)),
+      m_day(static_cast<unsigned short>(day)), m_hour(static_cast<unsigned short>(hour)),
+      m_minute(static_cast<unsigned short>(minute)), m_second(static_cast<unsigned short>(second)),
+      m_millisecond(static_cast<unsigned short>(millisecond)), m_tzHours(tzHours), m_tzFraction(tzFraction),
+      m_binary(nullptr) {}
 
 OEDateTimeBase::OEDateTimeBase(const OEDateTimeBase& other)
     : m_year(other.m_year), m_month(other.m_month), m_day(other.m_day), m_hour(other.m_hour),
@@ -262,6 +275,10 @@ unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* who
     if (fracDigits == 1) frac *= 10; // one digit counts as tenths of an hour
     if (StoreTimeZone(name, static_cast<short>(sign * hours), static_cast<short>(sign * frac)))
         pending |= kZoneNameMismatch;
+    if (nameLen && m_tzName.IsEmpty()) { // no memory for the name
+        Warn(OEPW_NULLPOINTER, whole, kCtxTime);
+        return 0;
+    }
     return 1;
 }
 
@@ -388,8 +405,10 @@ unsigned short OEDateTimeBase::GetTimeString(OEString& out) const {
         *p++ = '[';
         p = PutSigned(p, m_tzHours);
         if (m_tzFraction) {
+            // The fraction keeps its sign here ([-3.-50]); only the date form writes its
+            // absolute value. Kept so.
             *p++ = '.';
-            p = PutUnsigned(p, static_cast<unsigned>(m_tzFraction < 0 ? -m_tzFraction : m_tzFraction), 2);
+            p = PutSigned2(p, m_tzFraction);
         }
         if (!m_tzName.IsEmpty()) {
             *p++ = ':';
@@ -429,10 +448,7 @@ long long OEDateTimeBase::LocalTimeZoneOffset() {
     return asUtc - now;
 }
 
-void OEDateTimeBase::SetFromDays(long long days, long long secondsOfDay) {
-    long long y;
-    unsigned m, d;
-    CivilFromDays(days, y, m, d);
+void OEDateTimeBase::SetFromCivil(long long y, unsigned m, unsigned d, long long secondsOfDay) {
     m_year = static_cast<unsigned short>(y);
     m_month = static_cast<unsigned short>(m);
     m_day = static_cast<unsigned short>(d);
@@ -443,8 +459,20 @@ void OEDateTimeBase::SetFromDays(long long days, long long secondsOfDay) {
 
 unsigned short OEDateTimeBase::AssignSeconds(long long seconds) {
     if (seconds < kMinSeconds || seconds > kMaxSeconds) return 0;
-    const long long days = FloorDiv(seconds, kSecondsPerDay);
-    SetFromDays(days, seconds - days * kSecondsPerDay);
+    // A negative count is raised by whole four-year blocks of 1461 days until it is not
+    // negative, and the year lowered by four per block afterwards. Before March 1901 this takes
+    // every fourth year for a leap year (1900 among them), as it always has.
+    long long blocks = 0;
+    if (seconds < 0) {
+        blocks = (kFourYears - 1 - seconds) / kFourYears;
+        seconds += blocks * kFourYears;
+    }
+    long long y;
+    unsigned m, d;
+    CivilFromDays(seconds / kSecondsPerDay, y, m, d);
+    y -= 4 * blocks;
+    if (y < 1) return 0;
+    SetFromCivil(y, m, d, seconds % kSecondsPerDay);
     m_millisecond = 0;
     m_tzHours = 0;
     m_tzFraction = 0;
@@ -452,7 +480,9 @@ unsigned short OEDateTimeBase::AssignSeconds(long long seconds) {
 }
 
 unsigned short OEDateTimeBase::FromPrecInt(const OEPrecisionInteger& seconds) {
-    if (!seconds.IsValid()) return 0;
+    // Below three decimals the rescale multiplies: a magnitude past 63 bits could wrap to a
+    // plausible count, so it is refused first.
+    if (!seconds.IsValid() || (seconds.Decimal() < 3 && !seconds.FitInASInt64())) return 0;
     OEPrecisionInteger ms(seconds);
     ms.Decimal(3);
     if (!ms.FitInASInt64()) return 0;
@@ -479,7 +509,10 @@ unsigned short OEDateTimeBase::ConvertToLocalTime(short hours, short fraction) {
 OEDateTimeBase& OEDateTimeBase::operator+=(long long seconds) {
     // A date before 1902 has no count of seconds; it is left as it is.
     if (m_year < 1902) return *this;
-    if (AssignSeconds(GetTimeT() + seconds)) m_tzName = "";
+    const long long t = GetTimeT();
+    // A sum outside what AssignSeconds takes is refused before it can overflow.
+    if (seconds > kMaxSeconds - t || seconds < kMinSeconds - t) return *this;
+    if (AssignSeconds(t + seconds)) m_tzName.Truncate(0);
     return *this;
 }
 
@@ -578,17 +611,8 @@ void OEDateTimeBase::UnLockBuffer() {
 // --- OEDateTime, OETime -------------------------------------------------------------------
 
 OEDateTime::OEDateTime(short year, short month, short day, short hour, short minute, short second,
-                       short millisecond, short tzHours, short tzFraction) {
-    m_year = static_cast<unsigned short>(year);
-    m_month = static_cast<unsigned short>(month);
-    m_day = static_cast<unsigned short>(day);
-    m_hour = static_cast<unsigned short>(hour);
-    m_minute = static_cast<unsigned short>(minute);
-    m_second = static_cast<unsigned short>(second);
-    m_millisecond = static_cast<unsigned short>(millisecond);
-    m_tzHours = tzHours;
-    m_tzFraction = tzFraction;
-}
+                       short millisecond, short tzHours, short tzFraction)
+    : OEDateTimeBase(year, month, day, hour, minute, second, millisecond, tzHours, tzFraction) {}
 
 OEDateTime::OEDateTime(const char* text) {
     ConvertStringToOEDateTime(text);
@@ -609,17 +633,8 @@ OEDateTime OEDateTime::TimeBetween(const OEDateTimeBase&) const {
 }
 
 OETime::OETime(short year, short month, short day, short hour, short minute, short second, short millisecond,
-               short tzHours, short tzFraction) {
-    m_year = static_cast<unsigned short>(year);
-    m_month = static_cast<unsigned short>(month);
-    m_day = static_cast<unsigned short>(day);
-    m_hour = static_cast<unsigned short>(hour);
-    m_minute = static_cast<unsigned short>(minute);
-    m_second = static_cast<unsigned short>(second);
-    m_millisecond = static_cast<unsigned short>(millisecond);
-    m_tzHours = tzHours;
-    m_tzFraction = tzFraction;
-}
+               short tzHours, short tzFraction)
+    : OEDateTimeBase(year, month, day, hour, minute, second, millisecond, tzHours, tzFraction) {}
 
 OETime::OETime(const char* text) {
     ConvertStringToOETime(text);

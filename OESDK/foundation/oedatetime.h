@@ -26,7 +26,8 @@ public:
 
     // Parses a date-time (here and in OEDateTime) or a time (OETime); failures are logged.
     virtual OEDateTimeBase& operator=(const char* text);
-    // Time form: HHMMSS[.ms][[zone[:name]]] (milliseconds not padded). 1, or 0 when invalid.
+    // Time form: HHMMSS[.ms][[zone[.fraction][:name]]], milliseconds not padded, the fraction with
+    // its sign; the zone only when its hours are not 0 (else ":name" alone). 1, or 0 when invalid.
     virtual unsigned short GetTimeString(OEString& out) const;
     virtual unsigned short IsValidTime() const;
     // Date form: YYYYMMDD[HHMMSS[.XXX][[zone[:name]]]]. 1, or 0 (out untouched) when invalid.
@@ -35,7 +36,9 @@ public:
 
     OEDateTimeBase& operator=(const OEDateTimeBase& other);
     // Seconds since 1970 in universal time; fields become that instant, zone 0, milliseconds 0,
-    // name kept. Returns 0 (object unchanged) outside the years 1 to 3000.
+    // name kept. A negative count is counted in four-year blocks of 1461 days (so before March
+    // 1901 every fourth year is a leap year). Returns 0 (object unchanged) outside the years 1
+    // to 3000.
     unsigned short AssignSeconds(long long seconds);
     // An OEPrecisionInteger count of seconds since 1970 (universal time); its fraction becomes
     // the milliseconds (truncated). Returns 0 (object unchanged) when out of range or invalid.
@@ -101,6 +104,9 @@ public:
     void UnLockBuffer();
 
 protected:
+    // The fields as given, name empty, nothing validated (OEDateTime, OETime).
+    OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
+                   short millisecond, short tzHours, short tzFraction);
     // Irregularities of a zone that do not fail the parse; they are logged only once the whole
     // conversion has succeeded, so a failed conversion logs exactly its one failure.
     enum : unsigned { kZoneIrregular = 1, kZoneNameMismatch = 2 };
@@ -111,7 +117,7 @@ protected:
     // Stores the zone; true when a North American name does not belong to the offset.
     bool StoreTimeZone(const char* name, short hours, short fraction);
     static void LogPending(unsigned pending, const char* whole);
-    void SetFromDays(long long days, long long secondsOfDay);
+    void SetFromCivil(long long year, unsigned month, unsigned day, long long secondsOfDay);
 
     unsigned short m_year;
     unsigned short m_month;
@@ -186,6 +192,16 @@ public:
 
     OEPayrollDateTime& operator=(const char* text) override;
     OEPayrollDateTime& operator=(const OEPayrollDateTime& other);
+    // Seconds since 1970 (universal time) or a number of seconds, as in OEDateTime; a successful
+    // assignment clears the empty flag.
+    OEPayrollDateTime& operator=(long long seconds) {
+        if (AssignSeconds(seconds)) m_empty = 0;
+        return *this;
+    }
+    OEPayrollDateTime& operator=(const OEPrecisionInteger& seconds) {
+        if (FromPrecInt(seconds)) m_empty = 0;
+        return *this;
+    }
     unsigned short GetDateString(OEString& out) const override;
 
     // Sets or clears the empty flag; the other fields are left alone.

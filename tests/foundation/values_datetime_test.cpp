@@ -1,6 +1,7 @@
 // OEDateTime, OETime and OEPayrollDateTime: parsing with its warnings, both text forms, seconds
 // since 1970, zones and ordering. Runs under several TZ settings (tests.cmake): no expectation
 // here may depend on the machine's zone.
+#include "alloc_failure.h"
 #include "values_testlog.h"
 
 #include <cstdlib>
@@ -122,6 +123,13 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
     EXPECT_STREQ("CDT", zone.GetTimeZone());
     EXPECT_EQ(1, zone.SetTimeZone("MDT", -6, 0));
     EXPECT_TRUE(log.None());
+    {
+        OEDateTime named;
+        FailAllocations noMemory;
+        EXPECT_EQ(0, named.ConvertStringToOEDateTime("20240131[-5:EST]"));
+    }
+    EXPECT_TRUE(log.ExactlyOne(OEPW_NULLPOINTER, "20240131[-5:EST]", kTM));
+    OEThreadState::SetErrorCode(OETE_NONE);
     OEDateTime n("20240131[-3.5]");
     EXPECT_EQ(-3, n.GetTimeZoneHours());
     EXPECT_EQ(-50, n.GetTimeZoneFraction());
@@ -137,7 +145,9 @@ TEST_F(ValuesDateTime, TimeForm) {
                  {"120000.050", 1, "120000.50"},
                  {"120000[-5:EST]", 1, "120000[-5:EST]"},
                  {"1200[5.5:IST]", 1, "120000[5.50:IST]"},
-                 {"235959.999[-3.5]", 1, "235959.999[-3.50]"},
+                 {"235959.999[-3.5]", 1, "235959.999[-3.-50]"}, // the fraction keeps its sign here
+                 {"120000[4.05]", 1, "120000[4.05]"},
+                 {"[-0.5:NST]", 1, "000000:NST"},
                  {"[0:GMT]", 1, "000000:GMT"},
                  {"[0.5]", 1, "000000"},
                  {"12", 1, "120000"},
@@ -202,7 +212,7 @@ TEST_F(ValuesDateTime, SecondsSince1970) {
                 {-1, "19691231235959"},
                 {1706720400LL, "20240131170000"},
                 {-2145916800LL, "19020101"},
-                {-2208988800LL, "19000101"},
+                {-2208988800LL, "19000102"}, // four-year blocks: 1900 counts as a leap year
                 {951782400LL, "20000229"},
                 {4107542400LL, "21000301"},
                 {32535215999LL, "30001231235959"}};
@@ -214,12 +224,19 @@ TEST_F(ValuesDateTime, SecondsSince1970) {
     }
     OEDateTime d("20240131");
     EXPECT_EQ(0, d.AssignSeconds(32535216000LL));
-    EXPECT_EQ(0, d.AssignSeconds(-62135596801LL));
+    EXPECT_EQ(0, d.AssignSeconds(-62137324800LL)); // the year 0 by the blocks
+    EXPECT_EQ(0, d.AssignSeconds(-9223372036854775807LL - 1));
     EXPECT_EQ("20240131", DateText(d));
+    ASSERT_EQ(1, d.AssignSeconds(-2203977600LL)); // 1900-02-28 by the Gregorian rule
+    EXPECT_EQ(2, d.GetMonth());
+    EXPECT_EQ(29, d.GetDay());
 
     OEDateTime p(OEPrecisionInteger("1706720400.25"));
     EXPECT_EQ("20240131170000.250", DateText(p));
     p = OEPrecisionInteger("-0.5");
+    EXPECT_EQ("19691231235959.500", DateText(p));
+    // 2^93 + 1 seconds: times 1000 it would wrap to 1000 (1970-01-01 00:00:01).
+    EXPECT_EQ(0, p.FromPrecInt(OEPrecisionInteger("9903520314283042199192993793")));
     EXPECT_EQ("19691231235959.500", DateText(p));
 }
 
@@ -253,6 +270,13 @@ TEST_F(ValuesDateTime, ZoneConversionsAndAddition) {
     c += OEDateTime("19700102");
     EXPECT_EQ("20240301", DateText(c));
     c += -86400LL * 366;
+    EXPECT_EQ("20230301", DateText(c));
+    for (long long huge :
+         {9223372036854775807LL, -9223372036854775807LL - 1, 32535215999LL - 1677628800LL + 1}) {
+        c += huge; // refused, whatever the size: no overflow, no change
+        EXPECT_EQ("20230301", DateText(c));
+    }
+    c += OEPrecisionInteger("9223372036854775807");
     EXPECT_EQ("20230301", DateText(c));
 }
 
@@ -350,6 +374,10 @@ TEST_F(ValuesDateTime, PayrollDateTime) {
     OEPayrollDateTime copy;
     copy = p;
     EXPECT_EQ(1, copy.IsEmpty());
+    copy = 86400LL; // from seconds, as any date-time: no longer empty
+    EXPECT_EQ("19700102", DateText(copy));
+    p = OEPrecisionInteger("0.5");
+    EXPECT_EQ("19700101000000.500", DateText(p));
     EXPECT_TRUE(log.None());
 }
 
