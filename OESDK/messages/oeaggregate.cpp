@@ -427,6 +427,32 @@ OEDataObjList* OEAggregate::GetList(OETagID tag) const {
     return static_cast<OEDataObjList*>(Slot(row));
 }
 
+OEParseStatus OEAggregate::AdoptListChild(OEDataObj* parent, OEDataObjList& list, OEDataObj* child,
+                                          OETagID tag) {
+    if (!child) {
+        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+        return OEPS_NORESOURCE;
+    }
+    if (!list.Append(child)) {
+        delete child;
+        return OEPS_INVALID;
+    }
+    return parent->PushAndSetObject(child, tag);
+}
+
+int OEAggregate::BuildEach(OEDataObj* parent, OEBuilder* builder, const OEDataObjList& list) {
+    for (unsigned short i = 0; i < list.Entries(); ++i) {
+        OEDataObj* child = list.Get(i);
+        if (!child) continue;
+        int status = child->BuildObject(builder, OETAG_NONE);
+        if (status != OEBS_OK) {
+            builder->SetFailedObject(parent);
+            return status;
+        }
+    }
+    return OEBS_OK;
+}
+
 OEBuildStatus OEAggregate::Fail(OEBuilder* builder, OEBuildStatus status) {
     if (status != OEBS_OK) builder->SetFailedObject(this);
     return status;

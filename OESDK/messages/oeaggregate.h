@@ -181,6 +181,16 @@ protected:
     OEParseStatus StartChild(const OEFieldRow* row, const OETagDictionaryEntry* entry);
     // Deletes every child and list element.
     void DeleteChildren();
+
+public:
+    // Shared by the classes that keep lists of wrappers (message sets, synchronisation):
+    // appends a child the factory has just made (null: out of memory, status 3) to `list` and
+    // makes it the object being parsed under `parent`; a list that cannot grow gives 4 and the
+    // child is deleted.
+    static OEParseStatus AdoptListChild(OEDataObj* parent, OEDataObjList& list, OEDataObj* child,
+                                        OETagID tag);
+    // Writes every object of `list` in order; the first failure is recorded against `parent`.
+    static int BuildEach(OEDataObj* parent, OEBuilder* builder, const OEDataObjList& list);
 };
 
 #endif

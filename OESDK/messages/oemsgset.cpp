@@ -223,17 +223,14 @@ OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
     if (!factory) return OEPS_NORESOURCE;
     OEDataObj* sync = m_request ? static_cast<OEDataObj*>(factory->NewSyncRq(GetMsgSetVersion()))
                                 : static_cast<OEDataObj*>(factory->NewSyncRs(GetMsgSetVersion()));
-    if (!sync) return OEPS_NORESOURCE;
-    sync->SetType(tag);
-    if (m_request)
-        static_cast<OESyncRq*>(sync)->SetMsgsRqTag(GetType());
-    else
-        static_cast<OESyncRs*>(sync)->SetMsgsRsTag(GetType());
-    if (!m_sync.Append(sync)) {
-        delete sync;
-        return OEPS_INVALID;
+    if (sync) {
+        sync->SetType(tag);
+        if (m_request)
+            static_cast<OESyncRq*>(sync)->SetMsgsRqTag(GetType());
+        else
+            static_cast<OESyncRs*>(sync)->SetMsgsRsTag(GetType());
     }
-    return PushAndSetObject(sync, tag);
+    return OEAggregate::AdoptListChild(this, m_sync, sync, tag);
 }
 
 OEParseStatus OEMessageSetBase::PushTranObject(OETagID tag) {
@@ -243,17 +240,14 @@ OEParseStatus OEMessageSetBase::PushTranObject(OETagID tag) {
     // plain wrapper stands in for it until then.
     OEDataObj* trans = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(GetMsgSetVersion()))
                                  : static_cast<OEDataObj*>(factory->NewTransRs(GetMsgSetVersion()));
-    if (!trans) return OEPS_NORESOURCE;
-    trans->SetType(tag);
-    if (m_request)
-        static_cast<OETransRq*>(trans)->SetMsgsRqTag(GetType());
-    else
-        static_cast<OETransRs*>(trans)->SetMsgsRsTag(GetType());
-    if (!m_trans.Append(trans)) {
-        delete trans;
-        return OEPS_INVALID;
+    if (trans) {
+        trans->SetType(tag);
+        if (m_request)
+            static_cast<OETransRq*>(trans)->SetMsgsRqTag(GetType());
+        else
+            static_cast<OETransRs*>(trans)->SetMsgsRsTag(GetType());
     }
-    return PushAndSetObject(trans, tag);
+    return OEAggregate::AdoptListChild(this, m_trans, trans, tag);
 }
 
 unsigned short OEMessageSetBase::StoreTrans(unsigned short index, OEDataObj* trans, bool append) {

@@ -609,17 +609,11 @@ OEParseStatus OESyncRq::PushTranObject(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
     OETransRq* trans = factory->NewTransRq(GetMsgSetVersion());
-    if (!trans) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
+    if (trans) {
+        trans->SetType(entry->m_id);
+        trans->SetMsgsRqTag(GetMsgsRqTag());
     }
-    trans->SetType(entry->m_id);
-    trans->SetMsgsRqTag(GetMsgsRqTag());
-    if (!m_trans.Append(trans)) {
-        delete trans;
-        return OEPS_INVALID;
-    }
-    return PushAndSetObject(trans, entry->m_id);
+    return AdoptListChild(this, m_trans, trans, entry->m_id);
 }
 
 OEParseStatus OESyncRq::HandleTagStart(const OETagDictionaryEntry* entry) {
@@ -631,13 +625,7 @@ OEParseStatus OESyncRq::HandleTagStart(const OETagDictionaryEntry* entry) {
 int OESyncRq::Build(OEBuilder* builder) {
     int status = OEAggregate::Build(builder);
     if (status != OEBS_OK) return status;
-    for (unsigned short i = 0; i < m_trans.Entries(); ++i) {
-        OEDataObj* trans = m_trans.Get(i);
-        if (!trans) continue;
-        status = trans->BuildObject(builder, OETAG_NONE);
-        if (status != OEBS_OK) return Fail(builder, static_cast<OEBuildStatus>(status));
-    }
-    return OEBS_OK;
+    return BuildEach(this, builder, m_trans);
 }
 
 unsigned short OESyncRq::AllRequiredPresent() {
@@ -701,17 +689,11 @@ OEParseStatus OESyncRs::PushTranObject(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
     OETransRs* trans = factory->NewTransRs(GetMsgSetVersion());
-    if (!trans) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
+    if (trans) {
+        trans->SetType(entry->m_id);
+        trans->SetMsgsRsTag(GetMsgsRsTag());
     }
-    trans->SetType(entry->m_id);
-    trans->SetMsgsRsTag(GetMsgsRsTag());
-    if (!m_trans.Append(trans)) {
-        delete trans;
-        return OEPS_INVALID;
-    }
-    return PushAndSetObject(trans, entry->m_id);
+    return AdoptListChild(this, m_trans, trans, entry->m_id);
 }
 
 OEParseStatus OESyncRs::HandleTagStart(const OETagDictionaryEntry* entry) {
@@ -723,13 +705,7 @@ OEParseStatus OESyncRs::HandleTagStart(const OETagDictionaryEntry* entry) {
 int OESyncRs::Build(OEBuilder* builder) {
     int status = OEAggregate::Build(builder);
     if (status != OEBS_OK) return status;
-    for (unsigned short i = 0; i < m_trans.Entries(); ++i) {
-        OEDataObj* trans = m_trans.Get(i);
-        if (!trans) continue;
-        status = trans->BuildObject(builder, OETAG_NONE);
-        if (status != OEBS_OK) return Fail(builder, static_cast<OEBuildStatus>(status));
-    }
-    return OEBS_OK;
+    return BuildEach(this, builder, m_trans);
 }
 
 unsigned short OESyncRs::AllRequiredPresent() {
