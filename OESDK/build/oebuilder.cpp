@@ -5,8 +5,12 @@
 #include "tags/oedataobj.h"
 #include "tags/oetagdictionary.h"
 
+#include <cstdint>
 #include <cstdio>
 #include <cstring>
+#if defined(__SSE2__)
+#include <emmintrin.h>
+#endif
 #include <string>
 #include <vector>
 
@@ -33,20 +37,126 @@ const char* EntityFor(char c) {
     }
 }
 
+// The characters written as entity references: row 0 without, row 1 with the XML quotes.
+struct EscapeTable {
+    bool m_escape[2][256];
+    EscapeTable() : m_escape{} {
+        for (int quotes = 0; quotes < 2; ++quotes)
+            for (unsigned char c : {'>', '<', '&'}) m_escape[quotes][c] = true;
+        m_escape[1][static_cast<unsigned char>('"')] = true;
+        m_escape[1][static_cast<unsigned char>('\'')] = true;
+    }
+};
+const EscapeTable kEscape;
+
 inline bool NeedsEscape(char c, bool xmlQuote) {
-    return c == '>' || c == '<' || c == '&' || (xmlQuote && (c == '"' || c == '\''));
+    return kEscape.m_escape[xmlQuote ? 1 : 0][static_cast<unsigned char>(c)];
+}
+
+// The first character of [p, end) to write as an entity reference, or end.
+inline const char* FirstToEscape(const char* p, const char* end, bool xmlQuote) {
+#if defined(__SSE2__)
+    const __m128i lt = _mm_set1_epi8('<'), gt = _mm_set1_epi8('>'), amp = _mm_set1_epi8('&');
+    const __m128i dq = _mm_set1_epi8(xmlQuote ? '"' : '<'), sq = _mm_set1_epi8(xmlQuote ? '\'' : '<');
+    for (; end - p >= 16; p += 16) {
+        const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+        __m128i hit = _mm_or_si128(_mm_cmpeq_epi8(v, lt), _mm_cmpeq_epi8(v, gt));
+        hit = _mm_or_si128(hit, _mm_cmpeq_epi8(v, amp));
+        hit = _mm_or_si128(hit, _mm_or_si128(_mm_cmpeq_epi8(v, dq), _mm_cmpeq_epi8(v, sq)));
+        const unsigned mask = static_cast<unsigned>(_mm_movemask_epi8(hit));
+        if (mask) return p + __builtin_ctz(mask);
+    }
+#endif
+    while (p < end && !NeedsEscape(*p, xmlQuote)) ++p;
+    return p;
+}
+
+// Every tag of the dictionary by id with the length of its name, looked up once for the process.
+struct TagName {
+    const char* m_text; // null: no such tag
+    unsigned short m_length;
+};
+
+const std::vector<TagName>& MakeTagNames() {
+    static const std::vector<TagName> names = [] {
+        std::vector<TagName> table;
+        OETagDictionary* d = OETagDictionary::TheOETagDictionary();
+        unsigned n = NumberOfOEDictionaryEntry();
+        table.assign(n + 1, TagName{nullptr, 0});
+        for (unsigned id = 1; d && id <= n; ++id) {
+            const char* name = d->GetTagString(static_cast<OETagID>(id));
+            size_t length = name ? std::strlen(name) : 0;
+            if (length && length < 65535) table[id] = TagName{name, static_cast<unsigned short>(length)};
+        }
+        return table;
+    }();
+    return names;
+}
+
+// Set by every builder's constructor (always the same table), read without a guard afterwards.
+const std::vector<TagName>* g_tagNames = nullptr;
+
+inline const std::vector<TagName>& TagNames() {
+    return g_tagNames ? *g_tagNames : MakeTagNames();
+}
+
+// Room for `n` more bytes at the buffer's offset when the block already holds them (the case in
+// which OEBuffer::Write neither grows nor fails), else null.
+inline char* Room(OEBuffer* buffer, unsigned long n) {
+    char* block = buffer->GetBufferPtr();
+    const unsigned long end = buffer->GetBufferOffset() + n;
+    if (!block || n >= 65535 || end > buffer->GetBufferAllocation() || end >= OEBuffer::kMaxBufferSize)
+        return nullptr;
+    return block + buffer->GetBufferOffset();
+}
+
+// Copies n bytes that do not overlap; the short texts of tags and values (up to 16 bytes) take two
+// overlapping word moves instead of a call.
+inline void CopyBytes(char* to, const char* from, std::size_t n) {
+    std::uint64_t a, b;
+    if (n >= 8 && n <= 16) {
+        std::memcpy(&a, from, 8);
+        std::memcpy(&b, from + n - 8, 8);
+        std::memcpy(to, &a, 8);
+        std::memcpy(to + n - 8, &b, 8);
+    } else if (n >= 4 && n < 8) {
+        std::uint32_t c, d;
+        std::memcpy(&c, from, 4);
+        std::memcpy(&d, from + n - 4, 4);
+        std::memcpy(to, &c, 4);
+        std::memcpy(to + n - 4, &d, 4);
+    } else if (n < 4) {
+        for (std::size_t i = 0; i < n; ++i) to[i] = from[i];
+    } else {
+        std::memcpy(to, from, n);
+    }
+}
+
+// Ends a write made through Room at `end`: offset and data size both move there, as after Write.
+inline void Commit(OEBuffer* buffer, const char* end) {
+    const unsigned long at = static_cast<unsigned long>(end - buffer->GetBufferPtr());
+    buffer->SetBufferOffset(at);
+    buffer->SetBufferSize(at);
 }
 
 } // namespace
 
 OEBuilder::OEBuilder(OEBuildStringCrLfOpt crlf, unsigned short elemEndTags)
     : m_dictionary(OETagDictionary::TheOETagDictionary()), m_buffer(nullptr), m_stringOpt(OEBSO_STRICT),
-      m_crlf(crlf), m_elemEndTags(elemEndTags), m_failedObject(nullptr) {}
+      m_crlf(crlf), m_elemEndTags(elemEndTags), m_failedObject(nullptr) {
+    g_tagNames = &MakeTagNames();
+}
 
 OEBuilder::~OEBuilder() {}
 
 void OEBuilder::Put(const char* text, unsigned long length) {
     if (length == 0) return;
+    // The usual case: the bytes fit in the block as it is and are copied straight in.
+    if (char* room = Room(m_buffer, length)) {
+        std::memmove(room, text, length);
+        Commit(m_buffer, room + length);
+        return;
+    }
     if (length < 65535)
         m_buffer->Write(text, static_cast<unsigned short>(length));
     else
@@ -58,20 +168,15 @@ void OEBuilder::Put(const char* text) {
 }
 
 const char* OEBuilder::TagText(OETagID tag) const {
-    // Every tag of the dictionary by id, looked up once for the process.
-    static const std::vector<const char*> names = [] {
-        std::vector<const char*> table;
-        OETagDictionary* d = OETagDictionary::TheOETagDictionary();
-        unsigned n = NumberOfOEDictionaryEntry();
-        table.assign(n + 1, nullptr);
-        for (unsigned id = 1; d && id <= n; ++id) {
-            const char* name = d->GetTagString(static_cast<OETagID>(id));
-            table[id] = name && *name ? name : nullptr;
-        }
-        return table;
-    }();
+    const std::vector<TagName>& names = TagNames();
     if (!m_dictionary || tag == 0 || tag >= names.size()) return nullptr;
-    return names[tag];
+    return names[tag].m_text;
+}
+
+OEBuildStatus OEBuilder::PutTag(OETagType type, OETagID tag) {
+    const std::vector<TagName>& names = TagNames();
+    if (!m_dictionary || tag == 0 || tag >= names.size() || !names[tag].m_text) return OEBS_BADARGUMENT;
+    return AddTag(type, names[tag].m_text, names[tag].m_length);
 }
 
 OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringOpt stringOpt,
@@ -98,8 +203,23 @@ OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringO
 }
 
 OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name) {
-    if (!m_buffer || !name) return OEBS_BADARGUMENT;
-    size_t n = std::strlen(name);
+    if (!name) return OEBS_BADARGUMENT;
+    return AddTag(type, name, std::strlen(name));
+}
+
+OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name, size_t n) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    // One write per tag: "<", optional "/", the name, ">" and, except for elements, LF.
+    if (char* p = Room(m_buffer, n + 4)) {
+        *p++ = '<';
+        if (type == OETT_END) *p++ = '/';
+        CopyBytes(p, name, n);
+        p += n;
+        *p++ = '>';
+        if (type != OETT_ELEMENT) *p++ = '\n';
+        Commit(m_buffer, p);
+        return OEBS_OK;
+    }
     char small[128];
     if (n + 4 > sizeof(small)) {
         Put(type == OETT_END ? "</" : "<");
@@ -120,18 +240,15 @@ OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name) {
 }
 
 OEBuildStatus OEBuilder::AddTagStart(OETagID tag) {
-    const char* name = TagText(tag);
-    return name ? AddTag(OETT_START, name) : OEBS_BADARGUMENT;
+    return PutTag(OETT_START, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagEnd(OETagID tag) {
-    const char* name = TagText(tag);
-    return name ? AddTag(OETT_END, name) : OEBS_BADARGUMENT;
+    return PutTag(OETT_END, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagElement(OETagID tag) {
-    const char* name = TagText(tag);
-    return name ? AddTag(OETT_ELEMENT, name) : OEBS_BADARGUMENT;
+    return PutTag(OETT_ELEMENT, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagElementEnd(OETagID tag) {
@@ -233,11 +350,19 @@ OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt 
         Put(work.data(), work.size());
     } else if (macros == OEBSM_MACROS) {
         bool xmlQuote = OEUtility::GetXmlQuoteMacros() != 0;
-        const char* p = text;
         const char* end = text + length;
-        while (p < end && !NeedsEscape(*p, xmlQuote)) ++p;
+        const char* p = FirstToEscape(text, end, xmlQuote);
         if (p == end) {
-            Put(text, truncate ? value.SpecLength() : length);
+            const unsigned long n = truncate ? value.SpecLength() : length;
+            // Text and line end in one copy, the common case.
+            char* room = crlf == OEBCL_NEWLINE ? Room(m_buffer, n + 1) : nullptr;
+            if (room) {
+                CopyBytes(room, text, n);
+                room[n] = OE_NEW_LINE[0];
+                Commit(m_buffer, room + n + 1);
+                return OEBS_OK;
+            }
+            Put(text, n);
         } else {
             std::string work(text, static_cast<size_t>(p - text));
             for (; p < end; ++p) {
@@ -281,7 +406,8 @@ OEBuildStatus OEBuilder::AddRate(const OEPrecisionInteger& value) {
 
 OEBuildStatus OEBuilder::AddDateTime(const OEDateTime& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
-    OEString text;
+    // One text per thread, kept between calls: a date costs no allocation once it has grown.
+    static thread_local OEString text;
     if (!const_cast<OEDateTime&>(value).GetDateString(text)) return OEBS_NOTEXTFORM;
     Put(text.c_str(), text.GetStrLength());
     Put("\n", 1);

@@ -19,6 +19,8 @@
 #include "tags/oetagid.h"
 #include "tags/oeheadertag.h"
 
+#include <cstddef>
+
 class OEDataObj;
 class OETagDictionary;
 
@@ -128,6 +130,9 @@ public:
 protected:
     // The raw tag writer for a name that is not in the dictionary.
     OEBuildStatus AddTag(OETagType type, const char* name);
+    OEBuildStatus AddTag(OETagType type, const char* name, size_t length);
+    // The tag writer for a dictionary tag (status 3 when the id has no name).
+    OEBuildStatus PutTag(OETagType type, OETagID tag);
     virtual OEBuildStatus AddPrecisionInteger(const OEPrecisionInteger& value);
     // Appends raw bytes; the buffer's own out-of-memory report ends the build with status 1.
     void Put(const char* text, unsigned long length);

@@ -17,9 +17,6 @@ unsigned short ClampedLength(const char* text) {
 }
 } // namespace
 
-OEString::OEString()
-    : m_specLength(kUnlimited), m_buffer(nullptr), m_bufferSize(0), m_length(0), m_encoding(OESE_PLAIN) {}
-
 OEString::OEString(const char* text) : OEString() {
     CopyString(text);
 }

@@ -15,7 +15,8 @@ class OE_API OEString {
 public:
     enum : unsigned short { kUnlimited = 65535, kMaxLength = 65534 };
 
-    OEString();
+    OEString()
+        : m_specLength(kUnlimited), m_buffer(nullptr), m_bufferSize(0), m_length(0), m_encoding(OESE_PLAIN) {}
     OEString(const char* text);
     // A slice of `length` bytes (need not be NUL-terminated; stops at an embedded NUL).
     OEString(const char* text, unsigned short length);

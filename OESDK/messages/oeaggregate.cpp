@@ -13,10 +13,16 @@
 namespace {
 
 // Case-insensitive keyword match over a table; the index or -1.
+inline char UpperAscii(char c) {
+    return (c >= 'a' && c <= 'z') ? static_cast<char>(c - 32) : c;
+}
+
 int MatchKeyword(const OEKeywordTable* table, const char* text) {
     if (!table) return -1;
+    const char first = UpperAscii(*text);
     for (unsigned short i = 0; i < table->m_count; ++i) {
         const char* a = table->m_words[i];
+        if (UpperAscii(*a) != first) continue; // most keywords differ in their first letter
         const char* b = text;
         while (*a && *b) {
             char ca = *a, cb = *b;
@@ -51,37 +57,149 @@ bool ParseLong(const char* text, bool allowSign, long long& out) {
 
 OEAggregate::OEAggregate(unsigned short version) : OEDataObj(version) {}
 
-const unsigned char* OEAggregateDesc::Bits() const {
-    const unsigned char* bits = m_bits.load(std::memory_order_acquire);
-    if (bits) return bits;
-    unsigned char* fresh = new (std::nothrow) unsigned char[m_fieldCount ? m_fieldCount : 1];
-    if (!fresh) return nullptr;
-    for (unsigned short i = 0; i < m_fieldCount; ++i) {
-        fresh[i] = 0xFF;
-        for (unsigned short k = 0; k < m_validCount && k < 96; ++k) {
-            if (m_valid[k].m_tag == m_fields[i].m_tag) {
-                fresh[i] = static_cast<unsigned char>(k);
-                break;
-            }
+// The index of a descriptor, in one block: the hash slots, then one presence bit and one
+// "another valid row has this tag" flag per field row.
+struct OEAggregateIndex {
+    struct Slot {
+        OETagID m_tag;        // OETAG_NONE: empty
+        unsigned short m_row; // first field row with the tag, or 0xFFFF
+        unsigned char m_bit;  // first valid row with the tag (its presence bit), or 0xFF
+        unsigned char m_dup;  // 1 when a later valid row has the same tag (other versions)
+    };
+    unsigned m_mask;
+    const Slot* m_slots;
+    const unsigned char* m_rowBit;
+    const unsigned char* m_rowDup;
+
+    static unsigned Hash(OETagID tag) { return (static_cast<unsigned>(tag) * 0x9E3779B1u) >> 16; }
+    const Slot* Find(OETagID tag) const {
+        if (tag == OETAG_NONE) return nullptr;
+        for (unsigned i = Hash(tag) & m_mask;; i = (i + 1) & m_mask) {
+            if (m_slots[i].m_tag == tag) return &m_slots[i];
+            if (m_slots[i].m_tag == OETAG_NONE) return nullptr;
         }
     }
-    const unsigned char* expected = nullptr;
-    if (!m_bits.compare_exchange_strong(expected, fresh, std::memory_order_acq_rel)) {
-        delete[] fresh; // another thread won; the tables live as long as the process
+};
+
+namespace {
+
+// The rows of the valid table that own a presence bit.
+inline unsigned short BitRows(const OEAggregateDesc& d) {
+    return d.m_validCount < OEDataObj::kMaxValidTags ? d.m_validCount
+                                                     : static_cast<unsigned short>(OEDataObj::kMaxValidTags);
+}
+
+// The search SetTag makes: the first valid row with the tag that applies at `version`, from row
+// `from` on; -1 when there is none.
+int ScanBit(const OEAggregateDesc& d, OETagID tag, unsigned short version, unsigned short from = 0) {
+    const unsigned short count = BitRows(d);
+    for (unsigned short k = from; k < count; ++k)
+        if (d.m_valid[k].m_tag == tag && (d.m_valid[k].m_versionMask & version)) return k;
+    return -1;
+}
+
+// The presence bit a slot's tag owns at `version`, or -1.
+inline int SlotBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, unsigned short version) {
+    if (!s || s->m_bit == 0xFF) return -1;
+    if (d.m_valid[s->m_bit].m_versionMask & version) return s->m_bit;
+    return s->m_dup ? ScanBit(d, s->m_tag, version, static_cast<unsigned short>(s->m_bit + 1)) : -1;
+}
+
+OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
+    typedef OEAggregateIndex::Slot Slot;
+    const unsigned short bitRows = BitRows(d);
+    unsigned size = 8;
+    while (size < 2u * (static_cast<unsigned>(d.m_fieldCount) + bitRows)) size *= 2;
+    const std::size_t rows = d.m_fieldCount ? d.m_fieldCount : 1;
+    const std::size_t bytes = sizeof(OEAggregateIndex) + size * sizeof(Slot) + 2 * rows;
+    unsigned char* block = new (std::nothrow) unsigned char[bytes];
+    if (!block) return nullptr;
+    OEAggregateIndex* index = new (block) OEAggregateIndex;
+    Slot* slots = reinterpret_cast<Slot*>(block + sizeof(OEAggregateIndex));
+    unsigned char* rowBit = reinterpret_cast<unsigned char*>(slots + size);
+    unsigned char* rowDup = rowBit + rows;
+    for (unsigned i = 0; i < size; ++i) slots[i] = Slot{OETAG_NONE, 0xFFFF, 0xFF, 0};
+    index->m_mask = size - 1;
+    index->m_slots = slots;
+    index->m_rowBit = rowBit;
+    index->m_rowDup = rowDup;
+    auto slotOf = [&](OETagID tag) -> Slot* {
+        unsigned i = OEAggregateIndex::Hash(tag) & index->m_mask;
+        while (slots[i].m_tag != OETAG_NONE && slots[i].m_tag != tag) i = (i + 1) & index->m_mask;
+        slots[i].m_tag = tag;
+        return &slots[i];
+    };
+    for (unsigned short k = 0; k < bitRows; ++k) {
+        if (d.m_valid[k].m_tag == OETAG_NONE) continue;
+        Slot* s = slotOf(d.m_valid[k].m_tag);
+        if (s->m_bit == 0xFF)
+            s->m_bit = static_cast<unsigned char>(k);
+        else
+            s->m_dup = 1;
+    }
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        rowBit[i] = 0xFF;
+        rowDup[i] = 0;
+        if (d.m_fields[i].m_tag == OETAG_NONE) continue;
+        Slot* s = slotOf(d.m_fields[i].m_tag);
+        if (s->m_row == 0xFFFF) s->m_row = i;
+        rowBit[i] = s->m_bit;
+        rowDup[i] = s->m_dup;
+    }
+    return index;
+}
+
+} // namespace
+
+const OEAggregateIndex* OEAggregateDesc::MakeIndex() const {
+    OEAggregateIndex* fresh = BuildIndex(*this);
+    if (!fresh) return nullptr;
+    const OEAggregateIndex* expected = nullptr;
+    if (!m_index.compare_exchange_strong(expected, fresh, std::memory_order_acq_rel)) {
+        delete[] reinterpret_cast<unsigned char*>(
+            fresh); // another thread won; indexes live as long as the process
         return expected;
     }
     return fresh;
 }
 
-unsigned short OEAggregate::RowPresent(unsigned short index) const {
-    const OEAggregateDesc& d = Describe();
-    const unsigned char* bits = d.Bits();
-    if (!bits) return ValidateTag(d.m_fields[index].m_tag);
-    unsigned k = bits[index];
+const unsigned char* OEAggregateDesc::Bits() const {
+    const OEAggregateIndex* index = Index();
+    return index ? index->m_rowBit : nullptr;
+}
+
+const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
+    const unsigned short version = StoredMsgSetVersion();
+    if (const OEAggregateIndex* index = d.Index()) {
+        const OEAggregateIndex::Slot* s = index->Find(tag);
+        bit = SlotBit(d, s, version);
+        return s && s->m_row != 0xFFFF ? &d.m_fields[s->m_row] : nullptr;
+    }
+    bit = ScanBit(d, tag, version);
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (d.m_fields[i].m_tag == tag) return &d.m_fields[i];
+    return nullptr;
+}
+
+unsigned short OEAggregate::IsValidTag(OETagID tag) const {
+    int bit;
+    Locate(Describe(), tag, bit);
+    return bit >= 0 ? 1 : 0;
+}
+
+unsigned short OEAggregate::RowPresentIn(const OEAggregateDesc& d, unsigned short index) const {
+    const OEAggregateIndex* ix = d.Index();
+    if (!ix) return ValidateTag(d.m_fields[index].m_tag);
+    const unsigned k = ix->m_rowBit[index];
     if (k == 0xFF) return 0;
+    if (d.m_valid[k].m_versionMask & StoredMsgSetVersion())
+        return PresentBit(static_cast<unsigned short>(k)) ? 1 : 0;
     // A tag whose first row does not apply at this version may have a later row that does.
-    if (!(d.m_valid[k].m_versionMask & GetMsgSetVersion())) return ValidateTag(d.m_fields[index].m_tag);
-    return (GetPresentWord(static_cast<unsigned short>(k / 32)) >> (k % 32)) & 1u;
+    return ix->m_rowDup[index] ? ValidateTag(d.m_fields[index].m_tag) : 0;
+}
+
+unsigned short OEAggregate::RowPresent(unsigned short index) const {
+    return RowPresentIn(Describe(), index);
 }
 
 // Members own their children (OEOwnedChild, OEDataObjList), so they go with the members.
@@ -118,17 +236,15 @@ unsigned short OEAggregate::GetArrayOfRequiredTags(OEArrayOfTags& tags) const {
 }
 
 const OEFieldRow* OEAggregate::FindRow(OETagID tag) const {
-    const OEAggregateDesc& d = Describe();
-    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
-        if (d.m_fields[i].m_tag == tag) return &d.m_fields[i];
-    return nullptr;
+    int bit;
+    return Locate(Describe(), tag, bit);
 }
 
 OEParseStatus OEAggregate::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
-    const OEFieldRow* row = FindRow(entry->m_id);
-    if (!row || (row->m_kind != OEFK_CHILD && row->m_kind != OEFK_LIST) || !IsValidTag(entry->m_id))
-        return OEPS_INVALID;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
+    if (!row || (row->m_kind != OEFK_CHILD && row->m_kind != OEFK_LIST) || bit < 0) return OEPS_INVALID;
     return StartChild(row, entry);
 }
 
@@ -164,25 +280,27 @@ OEParseStatus OEAggregate::StartChild(const OEFieldRow* row, const OETagDictiona
 
 OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
     if (!entry) return OEPS_INVALID;
-    const OEFieldRow* row = FindRow(entry->m_id);
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
     if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) return OEPS_INVALID;
-    SetFromText(entry->m_id, value);
+    if (bit >= 0) StoreText(row, bit, value);
     return OEPS_OK;
 }
 
 unsigned short OEAggregate::RowApplies(unsigned short index) const {
-    const OEAggregateDesc& d = Describe();
-    const unsigned char* bits = d.Bits();
-    if (!bits || bits[index] == 0xFF) return IsValidTag(d.m_fields[index].m_tag);
-    if (d.m_valid[bits[index]].m_versionMask & GetMsgSetVersion()) return 1;
-    return IsValidTag(d.m_fields[index].m_tag); // a later row of the same tag may apply
+    return IsValidTag(Describe().m_fields[index].m_tag);
 }
 
 unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row) return 0;
-    unsigned short index = static_cast<unsigned short>(row - Describe().m_fields);
-    if (!RowApplies(index)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || bit < 0) return 0;
+    return StoreText(row, bit, text);
+}
+
+unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
+    const OETagID tag = row->m_tag;
+    const unsigned short mark = static_cast<unsigned short>(bit);
     void* slot = Slot(row);
     const char* s = text.c_str();
     switch (row->m_kind) {
@@ -193,48 +311,48 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
         str->SetSpecLength(spec);
         if (text.GetStrLength() && str->IsNull()) return 3; // no memory for the value
         if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
-        SetTag(tag);
+        SetPresentBit(mark);
         return 1;
     }
     // A value not yet present converts in place (its field is not read while unmarked); one that
     // is present converts through a copy, so that a refused text leaves the old value.
     case OEFK_AMOUNT: {
         OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
-        if (!RowPresent(index)) {
+        if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
         } else {
             OEPrecisionInteger value;
             if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
             *field = value;
         }
-        SetTag(tag);
+        SetPresentBit(mark);
         return 1;
     }
     case OEFK_DATETIME: {
         OEDateTime* field = static_cast<OEDateTime*>(slot);
-        if (!RowPresent(index)) {
+        if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEDateTime(s)) break;
         } else {
             OEDateTime value;
             if (!value.ConvertStringToOEDateTime(s)) break;
             *field = value;
         }
-        SetTag(tag);
+        SetPresentBit(mark);
         return 1;
     }
     case OEFK_TEXTLIST:
         return AppendText(tag, text);
     case OEFK_ENUM: {
-        int index = MatchKeyword(row->m_keywords, s);
-        if (index < 0) break;
-        *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(index);
-        SetTag(tag);
+        int keyword = MatchKeyword(row->m_keywords, s);
+        if (keyword < 0) break;
+        *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
+        SetPresentBit(mark);
         return 1;
     }
     case OEFK_BOOL: {
         if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
         *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
-        SetTag(tag);
+        SetPresentBit(mark);
         return 1;
     }
     case OEFK_USHORT:
@@ -257,7 +375,7 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
             }
             *static_cast<long*>(slot) = static_cast<long>(value);
         }
-        SetTag(tag);
+        SetPresentBit(mark);
         return 1;
     }
     default:
@@ -268,32 +386,39 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
 }
 
 unsigned short OEAggregate::SetText(OETagID tag, const OEString& value) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_TEXT || !IsValidTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_TEXT || bit < 0) return 0;
     OEString* str = static_cast<OEString*>(Slot(row));
     unsigned short spec = str->SpecLength();
     *str = value;
     str->SetSpecLength(spec);
-    return SetTag(tag);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
 }
 
 unsigned short OEAggregate::SetAmount(OETagID tag, const OEPrecisionInteger& value) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_AMOUNT || !IsValidTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_AMOUNT || bit < 0) return 0;
     *static_cast<OEPrecisionInteger*>(Slot(row)) = value;
-    return SetTag(tag);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
 }
 
 unsigned short OEAggregate::SetDateTime(OETagID tag, const OEDateTime& value) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_DATETIME || !IsValidTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_DATETIME || bit < 0) return 0;
     *static_cast<OEDateTime*>(Slot(row)) = value;
-    return SetTag(tag);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
 }
 
 unsigned short OEAggregate::SetNumber(OETagID tag, unsigned long value) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || !IsValidTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || bit < 0) return 0;
     switch (row->m_kind) {
     case OEFK_ENUM:
         if (!row->m_keywords || value >= row->m_keywords->m_count) return 0;
@@ -312,14 +437,17 @@ unsigned short OEAggregate::SetNumber(OETagID tag, unsigned long value) {
     default:
         return 0;
     }
-    return SetTag(tag);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
 }
 
 unsigned short OEAggregate::SetSigned(OETagID tag, long value) {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_SLONG || !IsValidTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_SLONG || bit < 0) return 0;
     *static_cast<long*>(Slot(row)) = value;
-    return SetTag(tag);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
 }
 
 unsigned short OEAggregate::SetChildObj(OETagID tag, OEDataObj* child) {
@@ -376,26 +504,33 @@ unsigned short OEAggregate::AppendToList(OETagID tag, OEDataObj* element) {
 }
 
 const OEString* OEAggregate::GetText(OETagID tag) const {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_TEXT || !ValidateTag(tag)) return nullptr;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_TEXT || bit < 0 || !PresentBit(static_cast<unsigned short>(bit)))
+        return nullptr;
     return static_cast<const OEString*>(Slot(row));
 }
 
 const OEPrecisionInteger* OEAggregate::GetAmount(OETagID tag) const {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_AMOUNT || !ValidateTag(tag)) return nullptr;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_AMOUNT || bit < 0 || !PresentBit(static_cast<unsigned short>(bit)))
+        return nullptr;
     return static_cast<const OEPrecisionInteger*>(Slot(row));
 }
 
 const OEDateTime* OEAggregate::GetDateTime(OETagID tag) const {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_DATETIME || !ValidateTag(tag)) return nullptr;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_DATETIME || bit < 0 || !PresentBit(static_cast<unsigned short>(bit)))
+        return nullptr;
     return static_cast<const OEDateTime*>(Slot(row));
 }
 
 unsigned long OEAggregate::GetNumber(OETagID tag) const {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || !ValidateTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || bit < 0 || !PresentBit(static_cast<unsigned short>(bit))) return 0;
     switch (row->m_kind) {
     case OEFK_ENUM:
     case OEFK_BOOL:
@@ -409,8 +544,10 @@ unsigned long OEAggregate::GetNumber(OETagID tag) const {
 }
 
 long OEAggregate::GetSigned(OETagID tag) const {
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_SLONG || !ValidateTag(tag)) return 0;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), tag, bit);
+    if (!row || row->m_kind != OEFK_SLONG || bit < 0 || !PresentBit(static_cast<unsigned short>(bit)))
+        return 0;
     return *static_cast<const long*>(Slot(row));
 }
 
@@ -459,7 +596,11 @@ OEBuildStatus OEAggregate::Fail(OEBuilder* builder, OEBuildStatus status) {
 }
 
 OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
-    if (row->m_kind != OEFK_LIST && !ValidateTag(row->m_tag)) return OEBS_OK;
+    if (row->m_kind != OEFK_LIST) {
+        int bit;
+        Locate(Describe(), row->m_tag, bit);
+        if (bit < 0 || !PresentBit(static_cast<unsigned short>(bit))) return OEBS_OK;
+    }
     return BuildPresentRow(builder, row);
 }
 
@@ -528,10 +669,24 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
 
 int OEAggregate::Build(OEBuilder* builder) {
     const OEAggregateDesc& d = Describe();
+    const OEAggregateIndex* ix = d.Index();
+    const unsigned short version = StoredMsgSetVersion();
     for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
         const OEFieldRow* row = &d.m_fields[i];
-        // Absent rows are skipped here, by their presence bit, before any other work.
-        if (row->m_kind != OEFK_LIST && !RowPresent(i)) continue;
+        // Absent rows are skipped here, by their presence bit, before any other work. A clear
+        // bit is an absent row unless a later valid row of the same tag may own the mark.
+        if (row->m_kind != OEFK_LIST) {
+            if (!ix) {
+                if (!ValidateTag(row->m_tag)) continue;
+            } else {
+                const unsigned k = ix->m_rowBit[i];
+                if (k == 0xFF) continue;
+                const bool applies = (d.m_valid[k].m_versionMask & version) != 0;
+                if (!applies || !PresentBit(static_cast<unsigned short>(k))) {
+                    if (applies || !ix->m_rowDup[i] || !ValidateTag(row->m_tag)) continue;
+                }
+            }
+        }
         OEBuildStatus status = BuildPresentRow(builder, row);
         if (status != OEBS_OK) return status;
     }

@@ -56,6 +56,8 @@ struct OEFieldRow {
     OEDataObj* (*m_make)(OEDataObjFactory* factory, unsigned short version);
 };
 
+struct OEAggregateIndex;
+
 // The descriptor of one aggregate class.
 struct OEAggregateDesc {
     OETagID m_type;
@@ -65,9 +67,16 @@ struct OEAggregateDesc {
     unsigned short m_requiredCount;
     const OEFieldRow* m_fields; // in build order
     unsigned short m_fieldCount;
-    // Filled on first use: for each field row, the position of its tag in the valid table (its
-    // presence bit), or 0xFF. Lets Build test presence without searching the table per row.
-    mutable std::atomic<const unsigned char*> m_bits{nullptr};
+    // Built on first use and kept for the process: a tag -> (field row, presence bit) hash index
+    // and, per field row, the position of its tag in the valid table (its presence bit) or 0xFF.
+    // Parsing, building and the typed accessors find a tag with one probe instead of searching
+    // the tables. Null only when memory was short (callers then search the tables).
+    mutable std::atomic<const OEAggregateIndex*> m_index{nullptr};
+    const OEAggregateIndex* Index() const {
+        const OEAggregateIndex* index = m_index.load(std::memory_order_acquire);
+        return index ? index : MakeIndex();
+    }
+    const OEAggregateIndex* MakeIndex() const;
     const unsigned char* Bits() const;
 };
 
@@ -106,7 +115,9 @@ public:
     // The class's descriptor.
     virtual const OEAggregateDesc& Describe() const = 0;
 
-    unsigned short GetArrayOfValidTags(OEArrayOfTags& tags) const override;
+    // The valid table is always the descriptor's: the index of the descriptor answers for it.
+    unsigned short GetArrayOfValidTags(OEArrayOfTags& tags) const final;
+    unsigned short IsValidTag(OETagID tag) const final;
     unsigned short GetArrayOfRequiredTags(OEArrayOfTags& tags) const override;
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
@@ -181,6 +192,16 @@ protected:
     OEParseStatus StartChild(const OEFieldRow* row, const OETagDictionaryEntry* entry);
     // Deletes every child and list element.
     void DeleteChildren();
+
+private:
+    // One probe of the descriptor's index: the field row of `tag` (or null) and the presence bit
+    // the tag owns at this object's version (or -1: the tag is not valid here), exactly what
+    // FindRow and SetTag's search of the valid table give.
+    const OEFieldRow* Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const;
+    // RowPresent for a known descriptor.
+    unsigned short RowPresentIn(const OEAggregateDesc& d, unsigned short index) const;
+    // Converts and stores the text of element row `row` whose tag owns presence bit `bit` (>= 0).
+    unsigned short StoreText(const OEFieldRow* row, int bit, const OEString& text);
 
 public:
     // Shared by the classes that keep lists of wrappers (message sets, synchronisation):

@@ -181,7 +181,7 @@ unsigned short OEBankStatementTx::SetCurrency(OEDataObj* currency) {
 
 // ---------------------------------------------------------------- BANKTRANLIST
 
-OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEAggregate(version), m_tx(16, 64) {
+OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEAggregate(version), m_tx(16, 512) {
     SetType(OETAG_BANKTRANLIST);
 }
 const OEAggregateDesc& OEBankTransactionList::Describe() const {

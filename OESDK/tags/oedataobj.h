@@ -122,6 +122,13 @@ public:
     std::uint32_t GetPresentWord(unsigned short index) const { return index < 3 ? m_present[index] : 0; }
 
 protected:
+    // Direct access to presence bit k (row k of the valid table, k < kMaxValidTags) and to the
+    // stored message-set version, for subclasses that index their own valid table: the same
+    // marks SetTag / ClearTag / ValidateTag work on, without a search of the table.
+    void SetPresentBit(unsigned short k) { m_present[k / 32] |= std::uint32_t(1) << (k % 32); }
+    bool PresentBit(unsigned short k) const { return (m_present[k / 32] >> (k % 32)) & 1u; }
+    unsigned short StoredMsgSetVersion() const { return m_msgSetVersion; }
+
     void SetParser(OEParser* parser) { m_parser = parser; }
     OEParser* GetParser() const { return m_parser; }
 

@@ -5,7 +5,9 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <memory>
+#include <string>
 
 using namespace msgtest;
 
@@ -181,6 +183,64 @@ TEST(Machinery, HostFactoryDecidesTheClassesOfAParsedTree) {
     EXPECT_NE(dynamic_cast<HostTx*>(tx), nullptr);
     file.reset();
     OEDataObj::SetFactory(previous);
+}
+
+// A tag that owns a different presence bit per version: MEMO is row 0 at version 1 and row 2 from
+// version 2 on, NAME (row 1) applies everywhere, and SIC (row 3) only at version 1. The index of
+// the descriptor must give the same bits as the row-by-row search of the valid table.
+const OETagRow kVersionedValid[] = {{OETAG_MEMO, OEVM_V1, 0},
+                                    {OETAG_NAME, OEVM_ALL, 0},
+                                    {OETAG_MEMO, OEVM_NOTV1, 0},
+                                    {OETAG_SIC, OEVM_V1, 0}};
+class Versioned : public OEAggregate {
+public:
+    explicit Versioned(unsigned short version) : OEAggregate(version) { SetType(OETAG_STMTTRN); }
+    const OEAggregateDesc& Describe() const override;
+    unsigned short Set(OETagID tag, const char* text) { return SetFromText(tag, OEString(text)); }
+    const OEString* Get(OETagID tag) const { return GetText(tag); }
+    OEString m_memo, m_name, m_sic;
+};
+const OEFieldRow kVersionedFields[] = {
+    {OETAG_NAME, OEFK_TEXT, OE_MEMBER(Versioned, m_name), nullptr, nullptr},
+    {OETAG_MEMO, OEFK_TEXT, OE_MEMBER(Versioned, m_memo), nullptr, nullptr},
+    {OETAG_SIC, OEFK_TEXT, OE_MEMBER(Versioned, m_sic), nullptr, nullptr},
+};
+const OEAggregateDesc kVersionedDesc =
+    OE_DESC(OETAG_STMTTRN, kVersionedValid, kVersionedValid, kVersionedFields);
+const OEAggregateDesc& Versioned::Describe() const {
+    return kVersionedDesc;
+}
+
+TEST(Machinery, ATagRepeatedInTheValidTableOwnsTheBitOfItsVersion) {
+    struct Case {
+        unsigned short version;
+        std::uint32_t memoBit; // the present word after setting MEMO alone
+        unsigned short sicValid;
+        const char* built;
+    };
+    // Version word 3 matches both masks: the first row that applies wins.
+    const Case cases[] = {{1, 1u << 0, 1, "<NAME>n\n<MEMO>m\n<SIC>s\n"},
+                          {2, 1u << 2, 0, "<NAME>n\n<MEMO>m\n"},
+                          {3, 1u << 0, 1, "<NAME>n\n<MEMO>m\n<SIC>s\n"}};
+    for (const Case& c : cases) {
+        Versioned v(c.version);
+        EXPECT_EQ(v.Get(OETAG_MEMO), nullptr);
+        ASSERT_EQ(v.Set(OETAG_MEMO, "m"), 1) << c.version;
+        EXPECT_EQ(v.GetPresentWord(0), c.memoBit) << c.version;
+        EXPECT_EQ(v.ValidateTag(OETAG_MEMO), 1);
+        ASSERT_NE(v.Get(OETAG_MEMO), nullptr);
+        EXPECT_STREQ(v.Get(OETAG_MEMO)->c_str(), "m");
+        EXPECT_EQ(v.IsValidTag(OETAG_SIC), c.sicValid) << c.version;
+        EXPECT_EQ(v.Set(OETAG_SIC, "s"), c.sicValid) << c.version;
+        EXPECT_EQ(v.IsValidTag(OETAG_CHECKNUM), 0);
+        OETagDictionaryEntry name{OETAG_NAME, "NAME"};
+        EXPECT_EQ(v.HandleTagElement(&name, OEString("n")), OEPS_OK);
+        EXPECT_EQ(BuildText(&v), c.built) << c.version;
+        // Clearing goes through the generic search and must find the same bit.
+        EXPECT_EQ(v.ClearTag(OETAG_MEMO), 1);
+        EXPECT_EQ(v.Get(OETAG_MEMO), nullptr) << c.version;
+        EXPECT_EQ(BuildText(&v).find("<MEMO>"), std::string::npos) << c.version;
+    }
 }
 
 int g_remaining = 0;
