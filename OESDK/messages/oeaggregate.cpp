@@ -5,6 +5,7 @@
 #include "foundation/oeparsewarning.h"
 #include "foundation/oethread.h"
 
+#include <cstdint>
 #include <cstdio>
 #include <cstring>
 #include <new>
@@ -70,6 +71,13 @@ struct OEAggregateIndex {
     const Slot* m_slots;
     const unsigned char* m_rowBit;
     const unsigned char* m_rowDup;
+    // For Build: per presence bit the first field row marked by it alone, each row's next row
+    // with the same bit (0xFFFF ends both), and the rows whose presence is not one bit: lists
+    // (always written) and tags repeated in the valid table.
+    const unsigned short* m_bitRow;
+    const unsigned short* m_rowNext;
+    const unsigned short* m_special;
+    unsigned short m_specialCount;
 
     static unsigned Hash(OETagID tag) { return (static_cast<unsigned>(tag) * 0x9E3779B1u) >> 16; }
     const Slot* Find(OETagID tag) const {
@@ -111,18 +119,27 @@ OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
     unsigned size = 8;
     while (size < 2u * (static_cast<unsigned>(d.m_fieldCount) + bitRows)) size *= 2;
     const std::size_t rows = d.m_fieldCount ? d.m_fieldCount : 1;
-    const std::size_t bytes = sizeof(OEAggregateIndex) + size * sizeof(Slot) + 2 * rows;
+    const std::size_t bytes = sizeof(OEAggregateIndex) + size * sizeof(Slot) +
+                              (OEDataObj::kMaxValidTags + 2 * rows) * sizeof(unsigned short) + 2 * rows;
     unsigned char* block = new (std::nothrow) unsigned char[bytes];
     if (!block) return nullptr;
     OEAggregateIndex* index = new (block) OEAggregateIndex;
     Slot* slots = reinterpret_cast<Slot*>(block + sizeof(OEAggregateIndex));
-    unsigned char* rowBit = reinterpret_cast<unsigned char*>(slots + size);
+    unsigned short* bitRow = reinterpret_cast<unsigned short*>(slots + size);
+    unsigned short* rowNext = bitRow + OEDataObj::kMaxValidTags;
+    unsigned short* special = rowNext + rows;
+    unsigned char* rowBit = reinterpret_cast<unsigned char*>(special + rows);
     unsigned char* rowDup = rowBit + rows;
     for (unsigned i = 0; i < size; ++i) slots[i] = Slot{OETAG_NONE, 0xFFFF, 0xFF, 0};
+    for (unsigned k = 0; k < OEDataObj::kMaxValidTags; ++k) bitRow[k] = 0xFFFF;
     index->m_mask = size - 1;
     index->m_slots = slots;
     index->m_rowBit = rowBit;
     index->m_rowDup = rowDup;
+    index->m_bitRow = bitRow;
+    index->m_rowNext = rowNext;
+    index->m_special = special;
+    index->m_specialCount = 0;
     auto slotOf = [&](OETagID tag) -> Slot* {
         unsigned i = OEAggregateIndex::Hash(tag) & index->m_mask;
         while (slots[i].m_tag != OETAG_NONE && slots[i].m_tag != tag) i = (i + 1) & index->m_mask;
@@ -146,6 +163,17 @@ OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
         rowBit[i] = s->m_bit;
         rowDup[i] = s->m_dup;
     }
+    // Rows in ascending order along each bit's chain.
+    for (unsigned short i = d.m_fieldCount; i-- > 0;) {
+        rowNext[i] = 0xFFFF;
+        if (d.m_fields[i].m_kind == OEFK_LIST || rowDup[i]) continue;
+        if (rowBit[i] == 0xFF) continue; // never present
+        rowNext[i] = bitRow[rowBit[i]];
+        bitRow[rowBit[i]] = i;
+    }
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (d.m_fields[i].m_kind == OEFK_LIST || (rowDup[i] && rowBit[i] != 0xFF))
+            special[index->m_specialCount++] = i;
     return index;
 }
 
@@ -671,6 +699,36 @@ int OEAggregate::Build(OEBuilder* builder) {
     const OEAggregateDesc& d = Describe();
     const OEAggregateIndex* ix = d.Index();
     const unsigned short version = StoredMsgSetVersion();
+    enum { kMaxOrdered = 128 };
+    if (ix && d.m_fieldCount <= kMaxOrdered) {
+        // The rows to write, found from the set presence bits rather than by testing every row
+        // (most rows of a large aggregate are absent), then put back into build order.
+        unsigned short order[kMaxOrdered];
+        unsigned n = 0;
+        for (unsigned short w = 0; w < 3; ++w) {
+            for (std::uint32_t bits = GetPresentWord(w); bits; bits &= bits - 1) {
+                const unsigned k = w * 32u + static_cast<unsigned>(__builtin_ctz(bits));
+                unsigned short r = ix->m_bitRow[k];
+                if (r == 0xFFFF || !(d.m_valid[k].m_versionMask & version)) continue;
+                for (; r != 0xFFFF; r = ix->m_rowNext[r]) order[n++] = r;
+            }
+        }
+        for (unsigned short i = 0; i < ix->m_specialCount; ++i) order[n++] = ix->m_special[i];
+        for (unsigned i = 1; i < n; ++i) {
+            const unsigned short r = order[i];
+            unsigned j = i;
+            for (; j > 0 && order[j - 1] > r; --j) order[j] = order[j - 1];
+            order[j] = r;
+        }
+        for (unsigned i = 0; i < n; ++i) {
+            const OEFieldRow* row = &d.m_fields[order[i]];
+            // A tag repeated in the valid table: its mark may be any of its rows' bits.
+            if (row->m_kind != OEFK_LIST && ix->m_rowDup[order[i]] && !ValidateTag(row->m_tag)) continue;
+            OEBuildStatus status = BuildPresentRow(builder, row);
+            if (status != OEBS_OK) return status;
+        }
+        return OEBS_OK;
+    }
     for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
         const OEFieldRow* row = &d.m_fields[i];
         // Absent rows are skipped here, by their presence bit, before any other work. A clear

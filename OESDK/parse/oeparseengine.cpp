@@ -636,6 +636,7 @@ OE_ALWAYS_INLINE unsigned short OEParseEngine::ReadText(const RawToken& token) {
 int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
     entry = nullptr;
     m_lastStartEmpty = false;
+    m_elementClosed = false;
     for (;;) {
         RawToken token;
         if (m_haveLookAhead) {
@@ -715,6 +716,16 @@ int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
                 // No string holds more than kMaxLength bytes: the value goes on cut, and logged.
                 if (next.m_length > OEString::kMaxLength)
                     LogAt(token.m_tagStart, OEPW_TOOLONG, name, nameLength, entry->m_id);
+                // "</NAME>" with the very bytes of the start tag's name, right after the value:
+                // the token the end tag would give is the one the driver passes over.
+                const unsigned long at = next.m_next;
+                if (m_skipElementEnd && at + 3 + nameLength <= m_size && m_data[at] == '<' &&
+                    m_data[at + 1] == '/' && SameBytes(m_data + at + 2, name, nameLength) &&
+                    m_data[at + 2 + nameLength] == '>') {
+                    m_pos = at + 3 + nameLength;
+                    m_elementEntry = nullptr;
+                    m_elementClosed = true;
+                }
                 return OETK_ELEMENT;
             }
             m_elementEntry = nullptr;

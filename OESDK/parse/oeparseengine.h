@@ -65,6 +65,15 @@ public:
     // ("<MEMO></MEMO>"): the driver treats it as an empty element when no aggregate takes it.
     unsigned short LastStartWasEmpty() const { return m_lastStartEmpty ? 1 : 0; }
 
+    // With `skip` set, an element's own end tag written right after its value ("<NAME>x</NAME>",
+    // the XML-like form) is consumed with the element instead of coming out as a token of its
+    // own, and LastElementClosed() says so. Off by default; the parser turns it on, since it would
+    // only pass over that end tag.
+    void SetSkipElementEndTags(bool skip) { m_skipElementEnd = skip; }
+    bool GetSkipElementEndTags() const { return m_skipElementEnd; }
+    // 1 when the element just returned had its end tag consumed with it.
+    unsigned short LastElementClosed() const { return m_elementClosed ? 1 : 0; }
+
     // Steps over a "--boundary" line of a multipart file, if the body starts with one. Returns 1,
     // or 0 when such a line has no end.
     unsigned short SkipBoundaryLine();
@@ -119,6 +128,8 @@ private:
     unsigned long m_piEnd;
     bool m_headersDone;
     bool m_lastStartEmpty;
+    bool m_skipElementEnd = false;
+    bool m_elementClosed = false;
     ValueText m_value;
     // The name of the last unknown element, whose end tag is dropped with it.
     OEString m_unknownElement;

@@ -168,7 +168,12 @@ OEParseStatus OESimpleParser::Parse(OEBuffer* buffer, OEDataObj* root, unsigned 
         if (!engine->SkipBoundaryLine()) status = OEPS_INVALID;
     }
 
-    if (status == OEPS_OK) status = RunTokenLoop(*engine);
+    if (status == OEPS_OK) {
+        const bool skipping = engine->GetSkipElementEndTags();
+        engine->SetSkipElementEndTags(true);
+        status = RunTokenLoop(*engine);
+        engine->SetSkipElementEndTags(skipping);
+    }
 
     if (status != OEPS_OK && status != OEPS_NORESOURCE) m_objectWithError = m_current;
 
@@ -247,6 +252,8 @@ OEParseStatus OESimpleParser::RunTokenLoop(OEParseEngine& engine) {
                 AppendParseException(OEPW_INVALIDELEM, OEString(NameOf(entry)), value, id, m_current);
             }
             previousElement = id;
+            // Its end tag came with it: the loop stands where it would after passing over it.
+            if (engine.LastElementClosed()) kind = OETK_ENDTAG;
             break;
         }
         case OETK_ENDTAG:

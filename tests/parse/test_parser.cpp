@@ -172,6 +172,9 @@ TEST(Parser, StoppingStatuses) {
         {nested + deep8 + "<DTSTART>1", OEPS_TOODEEP, "OEPW_INVALIDAGG BANKTRANLIST", OETAG_BANKTRANLIST},
         {nested + "<BANKTRANLIST><DTSTART>1", OEPS_INVALID, nullptr, OETAG_BANKTRANLIST},
         {nested + "</STMTTRNRS>", OEPS_BADENDTAG, "OEPW_INVALIDENDAGG STMTTRNRS", OETAG_STMTRS},
+        // An element's own end tag is passed over once; a second one closes nothing.
+        {nested + "<CURDEF>EUR</CURDEF></CURDEF>", OEPS_BADENDTAG, "OEPW_INVALIDENDAGG CURDEF", OETAG_STMTRS},
+        {nested + "<CURDEF>EUR</CURDEF>\n" + tail, OEPS_OK, nullptr, OETAG_NONE},
         {nested + "<TRNAMT 5", OEPS_INVALID, "OEPW_BADFORMAT <TRNAMT 5", OETAG_STMTRS},
         // A name too long for a 16-bit length is malformed, not a cut-down CURDEF.
         {nested + "<CURDEF" + std::string(65536, 'X') + ">EUR", OEPS_INVALID, "OEPW_BADFORMAT <CURDEFX",
