@@ -196,7 +196,7 @@ const unsigned char* OEAggregateDesc::Bits() const {
     return index ? index->m_rowBit : nullptr;
 }
 
-const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
+inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
     const unsigned short version = StoredMsgSetVersion();
     if (const OEAggregateIndex* index = d.Index()) {
         const OEAggregateIndex::Slot* s = index->Find(tag);
