@@ -5,6 +5,7 @@
 #include "tags/oedataobj.h"
 #include "tags/oetagdictionary.h"
 
+#include <atomic>
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
@@ -93,11 +94,13 @@ const std::vector<TagName>& MakeTagNames() {
     return names;
 }
 
-// Set by every builder's constructor (always the same table), read without a guard afterwards.
-const std::vector<TagName>* g_tagNames = nullptr;
+// Set by every builder's constructor (always the same table), then read without the guard of
+// the function-local static.
+std::atomic<const std::vector<TagName>*> g_tagNames{nullptr};
 
 inline const std::vector<TagName>& TagNames() {
-    return g_tagNames ? *g_tagNames : MakeTagNames();
+    const std::vector<TagName>* names = g_tagNames.load(std::memory_order_relaxed);
+    return names ? *names : MakeTagNames();
 }
 
 // Room for `n` more bytes at the buffer's offset when the block already holds them (the case in
@@ -144,7 +147,7 @@ inline void Commit(OEBuffer* buffer, const char* end) {
 OEBuilder::OEBuilder(OEBuildStringCrLfOpt crlf, unsigned short elemEndTags)
     : m_dictionary(OETagDictionary::TheOETagDictionary()), m_buffer(nullptr), m_stringOpt(OEBSO_STRICT),
       m_crlf(crlf), m_elemEndTags(elemEndTags), m_failedObject(nullptr) {
-    g_tagNames = &MakeTagNames();
+    g_tagNames.store(&MakeTagNames(), std::memory_order_relaxed);
 }
 
 OEBuilder::~OEBuilder() {}
