@@ -306,6 +306,18 @@ OEParseStatus OEAggregate::StartChild(const OEFieldRow* row, const OETagDictiona
     return PushAndSetObject(child, entry->m_id);
 }
 
+OEParseStatus OEAggregate::PushAndSetObject(OEDataObj* child, OETagID tag) {
+    if (!child) return OEPS_NORESOURCE;
+    if (tag != OETAG_NONE) {
+        child->SetType(tag);
+        int bit;
+        Locate(Describe(), tag, bit);
+        if (bit < 0) return OEPS_INVALID;
+        SetPresentBit(static_cast<unsigned short>(bit));
+    }
+    return OEDataObj::PushAndSetObject(child, OETAG_NONE); // version and parser, as always
+}
+
 OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
     if (!entry) return OEPS_INVALID;
     int bit;

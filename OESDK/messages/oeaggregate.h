@@ -122,6 +122,8 @@ public:
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
     using OEDataObj::HandleTagElement;
+    // The base protocol, with the tag marked through the descriptor's index.
+    OEParseStatus PushAndSetObject(OEDataObj* child, OETagID tag) override;
     int Build(OEBuilder* builder) override;
     OEDataObj* GetChild(unsigned short index) const override;
     unsigned short GetNumberOfChildren() const override;
