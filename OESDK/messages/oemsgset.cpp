@@ -160,7 +160,7 @@ const OETagID kRootBuildOrder[] = {
     OETAG_KEST_SURVEYMSGSRQV1, OETAG_KEST_SURVEYMSGSRQV2, OETAG_KEST_USLFIMSGSRQV1, OETAG_KEST_USLFIMSGSRQV2,
     OETAG_KEST_USLCUMSGSRQV1,  OETAG_KEST_USLCUMSGSRQV2,  OETAG_K_PAYROLLMSGSRQV1,  OETAG_K_EFILEMSGSRQV1};
 
-// Copies the tree of one list entry into a fresh object (transaction wrapper or sync).
+// Copies the tree of one child into an object of its class (sign-on, transaction wrapper or sync).
 template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
     return to->DeepCopyFrom(static_cast<const T*>(from));
 }
@@ -204,6 +204,18 @@ unsigned short OEMessageSetBase::GetNumberOfChildren() const {
     return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries());
 }
 
+OEParseStatus OEMessageSetBase::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    OETagID tag = entry->m_id;
+    if (tag == SignOnTag()) return PushSignOn(entry);
+    const WrapperTables* t = TablesOf(GetType());
+    bool listed = false;
+    if (t)
+        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
+    if (!listed) return OEPS_INVALID;
+    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
+}
+
 OEParseStatus OEMessageSetBase::PushSignOn(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
@@ -212,10 +224,22 @@ OEParseStatus OEMessageSetBase::PushSignOn(const OETagDictionaryEntry* entry) {
         delete m_signOn;
         m_signOn = nullptr;
     }
-    m_signOn = m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(GetMsgSetVersion()))
-                         : static_cast<OEDataObj*>(factory->NewSignOnRs(GetMsgSetVersion()));
+    m_signOn = NewSignOn(factory, GetMsgSetVersion());
     if (!m_signOn) return OEPS_NORESOURCE;
     return PushAndSetObject(m_signOn, entry->m_id);
+}
+
+OEDataObj* OEMessageSetBase::NewSignOn(OEDataObjFactory* factory, unsigned short version) const {
+    return m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(version))
+                     : static_cast<OEDataObj*>(factory->NewSignOnRs(version));
+}
+
+unsigned short OEMessageSetBase::StoreSignOn(OEDataObj* signOn) {
+    if (m_signOn != signOn) delete m_signOn;
+    if (!signOn) ClearTag(SignOnTag());
+    m_signOn = signOn;
+    SetTag(SignOnTag());
+    return 1;
 }
 
 OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
@@ -330,8 +354,25 @@ unsigned short OEMessageSetBase::AllRequiredPresent() {
 }
 
 unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
+    if (!other) return 0;
+    if (other == this) return 1;
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
+    if (other->m_signOn) {
+        if (!m_signOn) {
+            m_signOn = NewSignOn(factory, other->m_signOn->GetMsgSetVersion());
+            if (!m_signOn) return 0;
+        }
+        unsigned short ok = m_request ? CopyEntry(static_cast<OESignOnRq*>(m_signOn), other->m_signOn)
+                                      : CopyEntry(static_cast<OESignOnRs*>(m_signOn), other->m_signOn);
+        if (!ok) return 0;
+    } else if (m_signOn) {
+        delete m_signOn;
+        m_signOn = nullptr;
+        // The response's sign-on mark is cleared on both sides, so a request keeps its SONRQ
+        // mark: kept as it is.
+        ClearTag(OETAG_SONRS);
+    }
     // Transactions, then synchronisations: trim, add fresh entries, deep-copy index by index.
     for (int pass = 0; pass < 2; ++pass) {
         OEDataObjList& to = pass == 0 ? m_trans : m_sync;
@@ -375,53 +416,11 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
 
 // ---------------------------------------------------------------- OEMessageSetRq
 
-OEParseStatus OEMessageSetRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRQ) return PushSignOn(entry);
-    const WrapperTables* t = TablesOf(GetType());
-    bool listed = false;
-    if (t)
-        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
-    if (!listed) return OEPS_INVALID;
-    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
-}
-
-unsigned short OEMessageSetRq::SetSignOnRq(OESignOnRq* signOn) {
-    if (m_signOn != signOn) delete m_signOn;
-    if (!signOn) ClearTag(OETAG_SONRQ);
-    m_signOn = signOn;
-    SetTag(OETAG_SONRQ);
-    return 1;
-}
-
 unsigned short OEMessageSetRq::DisconnectSignOnRq() {
     if (!m_signOn) return 0;
     m_signOn = nullptr;
     ClearTag(OETAG_SONRQ);
     return 1;
-}
-
-unsigned short OEMessageSetRq::DeepCopyFrom(const OEMessageSetRq* other) {
-    if (!other) return 0;
-    if (other == this) return 1;
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    if (other->m_signOn) {
-        if (!m_signOn) {
-            m_signOn = factory->NewSignOnRq(other->m_signOn->GetMsgSetVersion());
-            if (!m_signOn) return 0;
-        }
-        if (!static_cast<OESignOnRq*>(m_signOn)->DeepCopyFrom(
-                static_cast<const OESignOnRq*>(other->m_signOn)))
-            return 0;
-    } else if (m_signOn) {
-        delete m_signOn;
-        m_signOn = nullptr;
-        // The response's sign-on tag is cleared here, not SONRQ: kept as it is.
-        ClearTag(OETAG_SONRS);
-    }
-    return CopyFrom(other);
 }
 
 OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
@@ -489,49 +488,6 @@ OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
     default:
         return OETAG_NONE;
     }
-}
-
-// ---------------------------------------------------------------- OEMessageSetRs
-
-OEParseStatus OEMessageSetRs::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRS) return PushSignOn(entry);
-    const WrapperTables* t = TablesOf(GetType());
-    bool listed = false;
-    if (t)
-        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
-    if (!listed) return OEPS_INVALID;
-    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
-}
-
-unsigned short OEMessageSetRs::SetSignOnRs(OESignOnRs* signOn) {
-    if (m_signOn != signOn) delete m_signOn;
-    if (!signOn) ClearTag(OETAG_SONRS);
-    m_signOn = signOn;
-    SetTag(OETAG_SONRS);
-    return 1;
-}
-
-unsigned short OEMessageSetRs::DeepCopyFrom(const OEMessageSetRs* other) {
-    if (!other) return 0;
-    if (other == this) return 1;
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    if (other->m_signOn) {
-        if (!m_signOn) {
-            m_signOn = factory->NewSignOnRs(other->m_signOn->GetMsgSetVersion());
-            if (!m_signOn) return 0;
-        }
-        if (!static_cast<OESignOnRs*>(m_signOn)->DeepCopyFrom(
-                static_cast<const OESignOnRs*>(other->m_signOn)))
-            return 0;
-    } else if (m_signOn) {
-        delete m_signOn;
-        m_signOn = nullptr;
-        ClearTag(OETAG_SONRS);
-    }
-    return CopyFrom(other);
 }
 
 // ================================================================ roots
