@@ -136,19 +136,14 @@ public:
     unsigned short m_include = 0;
 };
 
-// STMTRS.
-class OE_API OEBankStatementRs : public OETransBase {
+// The base of the statement responses: everything but the account, which each names itself.
+class OE_API OEGenericStatementRs : public OETransBase {
 public:
-    explicit OEBankStatementRs(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    explicit OEGenericStatementRs(unsigned short version = 0) : OETransBase(version) {}
     const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
     unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
     const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
     unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
     OEBankTransactionList* GetTransactionList() const {
         return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
     }
@@ -167,33 +162,28 @@ public:
     OEString360 m_mktgInfo;
 };
 
-// CCSTMTRS: the same pattern with CCACCTFROM.
-class OE_API OECCStatementRs : public OETransBase {
+// A statement request or response of one kind of account: GetAccountFrom and SetAccountFrom over
+// the child under Tag, of class Account.
+template <class Base, class Account, OETagID Tag> class OEStatementOf : public Base {
+public:
+    using Base::Base;
+    Account* GetAccountFrom() const { return static_cast<Account*>(this->GetChildObj(Tag)); }
+    unsigned short SetAccountFrom(Account* a) { return this->SetChildObj(Tag, a); }
+};
+
+// STMTRS.
+class OE_API OEBankStatementRs
+    : public OEStatementOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM> {
+public:
+    explicit OEBankStatementRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+};
+
+// CCSTMTRS: the same with CCACCTFROM.
+class OE_API OECCStatementRs : public OEStatementOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
-    unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
-    const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
-    unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
-    OEBankTransactionList* GetTransactionList() const {
-        return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
-    }
-    unsigned short SetTransactionList(OEBankTransactionList* l) { return SetChildObj(OETAG_BANKTRANLIST, l); }
-    OELedgerBalance* GetLedgerBalance() const {
-        return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL));
-    }
-    unsigned short SetLedgerBalance(OELedgerBalance* b) { return SetChildObj(OETAG_LEDGERBAL, b); }
-    OEAvailableBalance* GetAvailableBalance() const {
-        return static_cast<OEAvailableBalance*>(GetChildObj(OETAG_AVAILBAL));
-    }
-    unsigned short SetAvailableBalance(OEAvailableBalance* b) { return SetChildObj(OETAG_AVAILBAL, b); }
-
-    OEString3 m_curDef;
-    OEOwnedChild m_account, m_tranList, m_ledgerBal, m_availBal;
-    OEString360 m_mktgInfo;
 };
 
 // The base of the statement requests: one account and at most one INCTRAN.
@@ -212,23 +202,18 @@ public:
 };
 
 // STMTRQ.
-class OE_API OEBankStatementRq : public OEGenericStatementRq {
+class OE_API OEBankStatementRq
+    : public OEStatementOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEBankStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
 };
 
 // CCSTMTRQ.
-class OE_API OECCStatementRq : public OEGenericStatementRq {
+class OE_API OECCStatementRq : public OEStatementOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
 };
 
 #endif
