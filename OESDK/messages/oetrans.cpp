@@ -122,6 +122,16 @@ const RequiredInner* FindRequiredInner(OETagID wrapper) {
     return nullptr;
 }
 
+// The required inner aggregates of a wrapper present: the one tag, or the exclusive or of the two
+// or three (of their responses on the response side).
+unsigned short RequiredInnerPresent(const OEDataObj& wrapper, const RequiredInner& r, bool response) {
+    auto present = [&](OETagID tag) { return wrapper.ValidateTag(response ? OEResponseTagOf(tag) : tag); };
+    if (r.m_b == OETAG_NONE) return present(r.m_a);
+    unsigned short x = present(r.m_a) ^ present(r.m_b);
+    if (r.m_c != OETAG_NONE) x ^= present(r.m_c);
+    return x;
+}
+
 // ---- transaction request wrapper ----
 // Valid rows: the four elements, then all 52 inner requests (built once, below). An inner request
 // whose class is not part of the library yet has no field row: NewRq answers 4 for it.
@@ -395,31 +405,28 @@ const OEAggregateDesc& OEWarning::Describe() const {
     return kWarningDesc;
 }
 
-// ---------------------------------------------------------------- OETransRq
+// ---------------------------------------------------------------- OETransWrapper
 
-OETransRq::OETransRq(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRq::Describe() const {
-    return TransRqDesc();
+const OEFieldRow* OETransWrapper::FindInnerRow(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    return row && row->m_kind == OEFK_CHILD && Slot(row) == &m_actual ? row : nullptr;
 }
 
-OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
-    for (const InnerRow& r : kInner)
-        if (r.m_inner == tag) return r.m_wrapper;
-    return OETAG_NONE;
+unsigned short OETransWrapper::SetActualTrans(OETransBase* inner) {
+    if (inner) return FindInnerRow(inner->GetType()) ? SetChildObj(inner->GetType(), inner) : 0;
+    // Clearing goes through any one of the rows that share the inner slot.
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (FindInnerRow(d.m_fields[i].m_tag)) return SetChildObj(d.m_fields[i].m_tag, nullptr);
+    return 0;
 }
 
-unsigned short OETransRq::SetActualTrans(OETransBase* inner) {
-    if (!inner) return SetChildObj(OETAG_STMTRQ, nullptr);
-    if (!FindRow(inner->GetType())) return 0;
-    return SetChildObj(inner->GetType(), inner);
-}
-
-OEParseStatus OETransRq::NewRq(OETagID tag) {
+OEParseStatus OETransWrapper::NewInner(OETagID tag, OETagID efileTag) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    if (tag == OETAG_K_EFILERQ) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_CHILD || row->m_tag == OETAG_STATUS) return OEPS_INVALID;
+    if (tag == efileTag) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
+    const OEFieldRow* row = FindInnerRow(tag);
+    if (!row) return OEPS_INVALID;
     OEDataObj* inner = row->m_make(factory, GetMsgSetVersion());
     if (!inner) {
         OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
@@ -430,36 +437,42 @@ OEParseStatus OETransRq::NewRq(OETagID tag) {
     return OEPS_OK;
 }
 
-OEParseStatus OETransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OEParseStatus status = NewRq(entry->m_id);
+OEParseStatus OETransWrapper::StartInner(const OETagDictionaryEntry* entry, OETagID efileTag) {
+    OEParseStatus status = NewInner(entry->m_id, efileTag);
     if (status != OEPS_OK) return status;
     return PushAndSetObject(m_actual.get(), entry->m_id);
+}
+
+// ---------------------------------------------------------------- OETransRq
+
+OETransRq::OETransRq(unsigned short version) : OETransWrapper(version) {}
+const OEAggregateDesc& OETransRq::Describe() const {
+    return TransRqDesc();
+}
+
+OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
+    for (const InnerRow& r : kInner)
+        if (r.m_inner == tag) return r.m_wrapper;
+    return OETAG_NONE;
+}
+
+OEParseStatus OETransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    return StartInner(entry, OETAG_K_EFILERQ);
 }
 
 unsigned short OETransRq::AllRequiredPresent() {
     if (!m_actual.get() || !ValidateTag(OETAG_TRNUID)) return 0;
     if (GetType() == OETAG_NONE) return 0;
     const RequiredInner* r = FindRequiredInner(GetType());
-    if (!r) return 1;
-    if (r->m_b == OETAG_NONE) return ValidateTag(r->m_a);
-    unsigned short x = ValidateTag(r->m_a) ^ ValidateTag(r->m_b);
-    if (r->m_c != OETAG_NONE) x ^= ValidateTag(r->m_c);
-    return x;
+    return r ? RequiredInnerPresent(*this, *r, false) : 1;
 }
 
 // ---------------------------------------------------------------- OETransRs
 
-OETransRs::OETransRs(unsigned short version) : OETransBase(version) {}
+OETransRs::OETransRs(unsigned short version) : OETransWrapper(version) {}
 const OEAggregateDesc& OETransRs::Describe() const {
     return TransRsDesc();
-}
-
-unsigned short OETransRs::SetActualTrans(OETransBase* inner) {
-    if (!inner) return SetChildObj(OETAG_STMTRS, nullptr);
-    const OEFieldRow* row = FindRow(inner->GetType());
-    if (!row || row->m_tag == OETAG_STATUS || row->m_tag == OETAG_WARNING) return 0;
-    return SetChildObj(inner->GetType(), inner);
 }
 
 OETransBase* OETransRs::DisconnectActualTrans() {
@@ -479,32 +492,13 @@ unsigned short OETransRs::IsUpToDate() const {
     return ValidateTag(OETAG_STATUS) && s && s->ValidateTag(OETAG_CODE) && s->GetCode() == 1;
 }
 
-OEParseStatus OETransRs::NewRs(OETagID tag) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    if (tag == OETAG_K_EFILERS) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_CHILD || row->m_tag == OETAG_STATUS || row->m_tag == OETAG_WARNING)
-        return OEPS_INVALID;
-    OEDataObj* inner = row->m_make(factory, GetMsgSetVersion());
-    if (!inner) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
-    }
-    inner->SetType(tag);
-    SetChildObj(tag, inner);
-    return OEPS_OK;
-}
-
 OEParseStatus OETransRs::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
     if (entry->m_id == OETAG_STATUS || entry->m_id == OETAG_WARNING) {
         if (!IsValidTag(entry->m_id)) return OEPS_INVALID;
         return StartChild(FindRow(entry->m_id), entry);
     }
-    OEParseStatus status = NewRs(entry->m_id);
-    if (status != OEPS_OK) return status;
-    return PushAndSetObject(m_actual.get(), entry->m_id);
+    return StartInner(entry, OETAG_K_EFILERS);
 }
 
 unsigned short OETransRs::AllRequiredPresent() {
@@ -523,10 +517,7 @@ unsigned short OETransRs::AllRequiredPresent() {
     const RequiredInner* r = FindRequiredInner(rqTag);
     if (!r) return 1;
     if (IsErrorStatus() || IsUpToDate()) return 1;
-    if (r->m_b == OETAG_NONE) return ValidateTag(OEResponseTagOf(r->m_a));
-    unsigned short x = ValidateTag(OEResponseTagOf(r->m_a)) ^ ValidateTag(OEResponseTagOf(r->m_b));
-    if (r->m_c != OETAG_NONE) x ^= ValidateTag(OEResponseTagOf(r->m_c));
-    return x;
+    return RequiredInnerPresent(*this, *r, true);
 }
 
 // ---------------------------------------------------------------- OESyncRq

@@ -55,18 +55,46 @@ public:
     OEString m_title, m_msg;
 };
 
-// Every transaction request wrapper; its own tag says which one.
-class OE_API OETransRq : public OETransBase {
+// The common part of the transaction request and response wrappers: the inner aggregate (one
+// slot that every inner row of the table shares), TRNUID, CLTCOOKIE and the enclosing set's tag.
+class OE_API OETransWrapper : public OETransBase {
 public:
-    explicit OETransRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    explicit OETransWrapper(unsigned short version = 0) : OETransBase(version) {}
     OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
-    // Replaces the inner request (the old one is deleted) and marks its tag.
+    // Replaces the inner aggregate (the old one is deleted) and marks its tag; null only clears.
+    // 0 for an object whose tag is no inner row of the wrapper.
     unsigned short SetActualTrans(OETransBase* inner);
     const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
     unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
     const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
     unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
+
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransWrapper*>(other)->m_msgsTag;
+        return 1;
+    }
+
+    OEOwnedChild m_actual;
+    OEString36 m_trnUid;
+    OEString255 m_cltCookie;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // The field row of an inner aggregate (a child row in the inner slot), or null.
+    const OEFieldRow* FindInnerRow(OETagID tag) const;
+    // Creates the inner aggregate for a start tag as the actual transaction: 3 without a factory
+    // or memory, 4 for a tag without a class (yet); efileTag (K.EFILERQ or K.EFILERS) succeeds
+    // only when an inner aggregate is held.
+    OEParseStatus NewInner(OETagID tag, OETagID efileTag);
+    // NewInner, then the inner aggregate is the object being parsed.
+    OEParseStatus StartInner(const OETagDictionaryEntry* entry, OETagID efileTag);
+};
+
+// Every transaction request wrapper; its own tag says which one.
+class OE_API OETransRq : public OETransWrapper {
+public:
+    explicit OETransRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
     const OEString* GetTAN() const { return GetText(OETAG_TAN); }
     unsigned short SetTAN(const OEString& v) { return SetFromText(OETAG_TAN, v); }
     unsigned short GetSyncCompleteInfo() const {
@@ -81,41 +109,26 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override {
-        m_msgsTag = static_cast<const OETransRq*>(other)->m_msgsTag;
-        return 1;
-    }
 
-    OEOwnedChild m_actual;
-    OEString36 m_trnUid;
     unsigned short m_syncCompleteInfo = 0;
-    OEString255 m_cltCookie;
     OEBoundedString<80> m_tan;
-    OETagID m_msgsTag = OETAG_NONE;
 
 protected:
-    // Creates the inner request for a start tag as the actual transaction: 3 without a factory
-    // or memory, 4 for a tag without a class (yet); K.EFILERQ succeeds only when one is held.
-    OEParseStatus NewRq(OETagID tag);
+    // Creates the inner request for a start tag (K.EFILERQ succeeds only when one is held).
+    OEParseStatus NewRq(OETagID tag) { return NewInner(tag, OETAG_K_EFILERQ); }
 };
 
 // Every transaction response wrapper.
-class OE_API OETransRs : public OETransBase {
+class OE_API OETransRs : public OETransWrapper {
 public:
     explicit OETransRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
-    unsigned short SetActualTrans(OETransBase* inner);
     // Hands the inner response to the caller (not deleted).
     OETransBase* DisconnectActualTrans();
     OEStatus* GetStatus() const { return static_cast<OEStatus*>(m_status.get()); }
     unsigned short SetStatus(OEStatus* status) { return SetChildObj(OETAG_STATUS, status); }
     OEWarning* GetWarning() const { return static_cast<OEWarning*>(m_warning.get()); }
     unsigned short SetWarning(OEWarning* warning) { return SetChildObj(OETAG_WARNING, warning); }
-    const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
-    unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
-    const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
-    unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
     void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
     // STATUS present with SEVERITY ERROR.
@@ -125,19 +138,12 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override {
-        m_msgsTag = static_cast<const OETransRs*>(other)->m_msgsTag;
-        return 1;
-    }
 
-    OEOwnedChild m_actual, m_status, m_warning;
-    OEString36 m_trnUid;
-    OEString255 m_cltCookie;
-    OETagID m_msgsTag = OETAG_NONE;
+    OEOwnedChild m_status, m_warning;
 
 protected:
     // Creates the inner response for a start tag (the mirror of OETransRq::NewRq).
-    OEParseStatus NewRs(OETagID tag);
+    OEParseStatus NewRs(OETagID tag) { return NewInner(tag, OETAG_K_EFILERS); }
 };
 
 // Every synchronisation request (...SYNCRQ).
