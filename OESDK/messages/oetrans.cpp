@@ -134,7 +134,7 @@ unsigned short RequiredInnerPresent(const OEDataObj& wrapper, const RequiredInne
 
 // ---- transaction request wrapper ----
 // Valid rows: the four elements, then all 52 inner requests (built once, below). An inner request
-// whose class is not part of the library yet has no field row: NewRq answers 4 for it.
+// whose class is not part of the library yet has no field row: NewInner answers 4 for it.
 const OETagRow kTransRqRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}};
 const OEFieldRow kTransRqFields[] = {
     {OETAG_TRNUID, OEFK_TEXT, OE_MEMBER(OETransRq, m_trnUid), nullptr, nullptr},

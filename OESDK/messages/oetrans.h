@@ -112,10 +112,6 @@ public:
 
     unsigned short m_syncCompleteInfo = 0;
     OEBoundedString<80> m_tan;
-
-protected:
-    // Creates the inner request for a start tag (K.EFILERQ succeeds only when one is held).
-    OEParseStatus NewRq(OETagID tag) { return NewInner(tag, OETAG_K_EFILERQ); }
 };
 
 // Every transaction response wrapper.
@@ -140,10 +136,6 @@ public:
     unsigned short AllRequiredPresent() override;
 
     OEOwnedChild m_status, m_warning;
-
-protected:
-    // Creates the inner response for a start tag (the mirror of OETransRq::NewRq).
-    OEParseStatus NewRs(OETagID tag) { return NewInner(tag, OETAG_K_EFILERS); }
 };
 
 // Every synchronisation request (...SYNCRQ).
