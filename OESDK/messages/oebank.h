@@ -91,17 +91,25 @@ public:
     OEOwnedChild m_accountTo;
 };
 
-// BANKTRANLIST: DTSTART, DTEND and the transactions in order.
-class OE_API OEBankTransactionList : public OEAggregate {
+// The DTSTART / DTEND pair of a transaction list and of INCTRAN.
+class OE_API OEDateRange : public OEAggregate {
 public:
-    explicit OEBankTransactionList(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    explicit OEDateRange(unsigned short version = 0) : OEAggregate(version) {}
     const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
     unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
     unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
     const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
     unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
     unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
+
+    OEDateTime m_dtStart, m_dtEnd;
+};
+
+// BANKTRANLIST: DTSTART, DTEND and the transactions in order.
+class OE_API OEBankTransactionList : public OEDateRange {
+public:
+    explicit OEBankTransactionList(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
     unsigned short AppendStatementTx(OEBankStatementTx* tx) { return AppendToList(OETAG_STMTTRN, tx); }
     // Replaces the entry at index (index equal to the count appends); the old one is deleted.
     unsigned short SetStatementTx(unsigned short index, OEBankStatementTx* tx);
@@ -113,26 +121,18 @@ public:
     void ClearStatementTx();
     void DeleteAllStatementTx();
 
-    OEDateTime m_dtStart, m_dtEnd;
     OEDataObjList m_tx;
 };
 
 // INCTRAN: DTSTART, DTEND, INCLUDE (required).
-class OE_API OEIncTransaction : public OEAggregate {
+class OE_API OEIncTransaction : public OEDateRange {
 public:
     explicit OEIncTransaction(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
     unsigned short GetInclude() const { return static_cast<unsigned short>(GetNumber(OETAG_INCLUDE)); }
     unsigned short SetInclude(const OEString& v) { return SetFromText(OETAG_INCLUDE, v); }
     unsigned short SetInclude(unsigned short v) { return SetNumber(OETAG_INCLUDE, v); }
 
-    OEDateTime m_dtStart, m_dtEnd;
     unsigned short m_include = 0;
 };
 
