@@ -82,6 +82,13 @@ struct OEAggregateDesc {
             static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields,                     \
             static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
     }
+// The same for a class without required rows, whose AllRequiredPresent states the whole rule (the
+// required table is empty: it points at the valid rows with a count of 0).
+#define OE_DESC_NO_REQUIRED(tag, valid, fields)                                                              \
+    OEAggregateDesc {                                                                                        \
+        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), valid, 0, fields,         \
+            static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
+    }
 
 typedef OEPtrArray<OEDataObj> OEDataObjList;
 

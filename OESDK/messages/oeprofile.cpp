@@ -59,7 +59,6 @@ const OETagRow kProfileValid[] = {
     {OETAG_PROFMSGSETV1, OEVM_ALL, 0},       {OETAG_PROFMSGSETV2, OEVM_NOTV1, 0},
     {OETAG_SIGNONMSGSETV1, OEVM_ALL, 0},     {OETAG_SIGNONMSGSETV2, OEVM_NOTV1, 0},
 };
-const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
 const OEFieldRow kProfileFields[] = {
     {OETAG_SIGNUPMSGSETV1, OEFK_CHILD, OE_MEMBER(OEMessageSetProfile, m_versions[0]), nullptr,
      OE_MAKE(NewMessageSetVersion)},
@@ -142,14 +141,7 @@ const OEFieldRow kListFields[] = {
 
 const OEAggregateDesc kCoreDesc = OE_DESC(OETAG_MSGSETCORE, kCoreValid, kCoreRequired, kCoreFields);
 const OEAggregateDesc kVersionDesc = OE_DESC(OETAG_NONE, kVersionValid, kVersionValid, kVersionFields);
-const OEAggregateDesc kProfileDesc = {
-    OETAG_NONE,
-    kProfileValid,
-    static_cast<unsigned short>(sizeof(kProfileValid) / sizeof(kProfileValid[0])),
-    kNoRows,
-    0,
-    kProfileFields,
-    static_cast<unsigned short>(sizeof(kProfileFields) / sizeof(kProfileFields[0]))};
+const OEAggregateDesc kProfileDesc = OE_DESC_NO_REQUIRED(OETAG_NONE, kProfileValid, kProfileFields);
 const OEAggregateDesc kListDesc = OE_DESC(OETAG_MSGSETLIST, kListValid, kListRequired, kListFields);
 
 } // namespace

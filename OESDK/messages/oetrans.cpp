@@ -239,7 +239,6 @@ const OETagRow kSyncRsValid[] = {{OETAG_TOKEN, OEVM_ALL, 0},
                                  {OETAG_K_EMPNEXTID, OEVM_ALL, 0},
                                  {OETAG_K_PITEMNEXTID, OEVM_ALL, 0},
                                  OE_SYNC_WRAPPER_ROWS(RS)};
-const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
 const OEFieldRow kSyncRsFields[] = {
     {OETAG_TOKEN, OEFK_TEXT, OE_MEMBER(OESyncRs, m_token), nullptr, nullptr},
     {OETAG_TOKEN2, OEFK_TEXT, OE_MEMBER(OESyncRs, m_token2), nullptr, nullptr},
@@ -294,14 +293,7 @@ const OEAggregateDesc kStatusDesc = OE_DESC(OETAG_STATUS, kStatusValid, kStatusR
 const OEAggregateDesc kWarningDesc = OE_DESC(OETAG_WARNING, kWarningValid, kWarningValid, kWarningFields);
 const OEAggregateDesc kSyncRqDesc = OE_DESC(OETAG_NONE, kSyncRqValid, kSyncRqRequired, kSyncRqFields);
 // No generic required rows: the token rule below is the whole check.
-const OEAggregateDesc kSyncRsDesc = {
-    OETAG_NONE,
-    kSyncRsValid,
-    static_cast<unsigned short>(sizeof(kSyncRsValid) / sizeof(kSyncRsValid[0])),
-    kNoRows,
-    0,
-    kSyncRsFields,
-    static_cast<unsigned short>(sizeof(kSyncRsFields) / sizeof(kSyncRsFields[0]))};
+const OEAggregateDesc kSyncRsDesc = OE_DESC_NO_REQUIRED(OETAG_NONE, kSyncRsValid, kSyncRsFields);
 
 bool IsSyncWrapper(OETagID tag, bool response) {
     for (OETagID t : kSyncWrappers)
