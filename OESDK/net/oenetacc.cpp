@@ -173,6 +173,20 @@ OENetStatus OENetRequest::GetReplySize(unsigned long* size) {
     return OENetOK;
 }
 
+bool OENetRequest::AppendFileInBlocks(const char* path, OEBuffer* buffer) {
+    const std::size_t kBlock = 10000;
+    std::FILE* f = _LDfopen(path, "rb");
+    if (!f) return false;
+    char block[kBlock];
+    for (;;) {
+        std::size_t n = std::fread(block, 1, kBlock, f);
+        if (n > 0 && buffer->Write(block, static_cast<unsigned short>(n)) != OEBR_SUCCESS) break;
+        if (n < kBlock) break;
+    }
+    std::fclose(f);
+    return true;
+}
+
 OENetStatus OENetRequest::LoadReply(OEBuffer* buffer) {
     if (!HasFileScheme(m_url.c_str()) || !buffer) return OENetReplyLoadFailed;
     char path[1024];

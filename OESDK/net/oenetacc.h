@@ -168,6 +168,10 @@ public:
     const OEString& GetURL() const { return m_url; }
 
 protected:
+    // Appends a whole file to a buffer in blocks of 10000 bytes until a block comes back short (or
+    // the buffer cannot grow). false when the file cannot be opened.
+    static bool AppendFileInBlocks(const char* path, OEBuffer* buffer);
+
     OEString m_url;
 };
 

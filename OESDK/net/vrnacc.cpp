@@ -11,7 +11,6 @@
 
 namespace {
 const char kModule[] = "vrnacc";
-const unsigned long kBlock = 10000;
 
 bool IsHttpsScheme(const char* url) {
     return std::strncmp(url, "https:", 6) == 0;
@@ -19,21 +18,6 @@ bool IsHttpsScheme(const char* url) {
 
 void CopyPath(char (&out)[1024], const char* in) {
     std::snprintf(out, sizeof out, "%s", in ? in : "");
-}
-
-// Appends a whole file to a buffer in blocks of 10000 bytes until a block comes back short.
-// Returns false when the file cannot be opened.
-bool ReadFileInto(const char* path, OEBuffer* buffer) {
-    std::FILE* f = _LDfopen(path, "rb");
-    if (!f) return false;
-    char block[kBlock];
-    for (;;) {
-        std::size_t n = std::fread(block, 1, kBlock, f);
-        if (n > 0 && buffer->Write(block, static_cast<unsigned short>(n)) != OEBR_SUCCESS) break;
-        if (n < kBlock) break;
-    }
-    std::fclose(f);
-    return true;
 }
 
 void RemoveFile(const char* path) {
@@ -318,7 +302,7 @@ OENetStatus VRNNetRequest::Transfer(bool post, const char* contentType, const ch
 
     if (m_saveHeaders == 1) {
         m_replyHeaders.ClearBuffer(0);
-        ReadFileInto(m_headerFile, &m_replyHeaders);
+        AppendFileInBlocks(m_headerFile, &m_replyHeaders);
     }
     if (m_completionCode != 0 || m_replySize == 0) {
         RemoveFile(m_replyFile);
@@ -504,7 +488,7 @@ OENetStatus VRNNetRequest::MapNetStatus(unsigned long code) {
 OENetStatus VRNNetRequest::LoadReply(OEBuffer* buffer) {
     if (HasFileScheme(m_url.c_str())) return OENetRequest::LoadReply(buffer);
     if (!buffer || m_replySize == 0) return OENetReplyLoadFailed;
-    if (!ReadFileInto(m_replyFile, buffer)) return OENetReplyLoadFailed;
+    if (!AppendFileInBlocks(m_replyFile, buffer)) return OENetReplyLoadFailed;
     RemoveFile(m_replyFile);
     RemoveFile(m_headerFile);
     std::uint32_t expected = m_replySize;
