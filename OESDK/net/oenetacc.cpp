@@ -112,11 +112,15 @@ void OENetAccess::LogMessage(const char* text, unsigned short level, const char*
 
 void OENetAccess::LogFormat(unsigned short level, const char* format, ...) {
     if (!m_logCallback) return;
-    char line[1024];
     va_list args;
     va_start(args, format);
-    std::vsnprintf(line, sizeof line, format, args);
+    LogFormatV(level, format, args);
     va_end(args);
+}
+
+void OENetAccess::LogFormatV(unsigned short level, const char* format, va_list args) {
+    char line[1024];
+    std::vsnprintf(line, sizeof line, format, args);
     LogMessage(line, level, "");
 }
 

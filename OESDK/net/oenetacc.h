@@ -10,6 +10,7 @@
 #include "foundation/oebuffer.h"
 #include "foundation/oestring.h"
 
+#include <cstdarg>
 #include <cstddef>
 
 // Result of every transport operation.
@@ -77,6 +78,12 @@ public:
     void LogFormat(unsigned short level, const char* format, ...)
 #if defined(__GNUC__)
         __attribute__((format(printf, 3, 4)))
+#endif
+        ;
+    // The same over a va_list, handed to LogMessage whether or not a callback is set.
+    void LogFormatV(unsigned short level, const char* format, va_list args)
+#if defined(__GNUC__)
+        __attribute__((format(printf, 3, 0)))
 #endif
         ;
     virtual void UpdateSessionStatus(OEOpCode op, void* first, void* second);

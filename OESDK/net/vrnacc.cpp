@@ -164,12 +164,10 @@ void VRNNetRequest::ReleaseTicket() {
 
 void VRNNetRequest::Log(unsigned short level, const char* format, ...) {
     if (!m_access) return;
-    char line[1024];
     va_list args;
     va_start(args, format);
-    std::vsnprintf(line, sizeof line, format, args);
+    m_access->LogFormatV(level, format, args);
     va_end(args);
-    m_access->LogMessage(line, level, "");
 }
 
 OENetStatus VRNNetRequest::Send(const OEString& url, OEBuffer* body) {
