@@ -183,28 +183,7 @@ OENetStatus VRNNetRequest::SendPlusHeadersContent(const OEString& url, OEBuffer*
     m_request = nullptr;
     m_url = url;
     Log(OENetLogDetail, "VRN: Beginning send to %s", url.c_str());
-    OENetStatus status = OENetOK;
-    if (!m_access) {
-        status = OENetRequestFailed;
-    } else {
-        OEString temp = m_access->GetTempFilePath();
-        status = m_access->OpenInternetIfNeeded();
-        if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
-        if (status == OENetOK) {
-            long result = 0;
-            const char* bytes = body && body->GetBufferPtr() ? body->GetBufferPtr() : "";
-            unsigned long length = body && body->GetBufferPtr() ? body->GetBufferSize() : 0;
-            m_request =
-                m_access->GetClient()->ICSendDataRequest(&result, m_access->m_session, url.c_str(), bytes,
-                                                         length, temp.c_str(), CompletionCallback, m_ticket);
-            if (result != 0 || !m_request) {
-                Log(OENetLogError, "***VRN ICSendDataRequest:  %d", static_cast<int>(result));
-                status = OENetRequestFailed;
-            } else {
-                status = Transfer(true, contentType, headers);
-            }
-        }
-    }
+    OENetStatus status = m_access ? Begin(true, body, contentType, headers) : OENetRequestFailed;
     Log(OENetLogDetail, "VRN: End send to %s, netstatus %d", url.c_str(), static_cast<int>(status));
     m_request = nullptr;
     return status;
@@ -220,24 +199,37 @@ OENetStatus VRNNetRequest::Get(const OEString& url) {
         Log(OENetLogError, "***VRN: ICGetFileRequest returns %d", 3);
         status = OENetRequestFailed;
     } else {
-        OEString temp = m_access->GetTempFilePath();
-        status = m_access->OpenInternetIfNeeded();
-        if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
-        if (status == OENetOK) {
-            long result = 0;
-            m_request = m_access->GetClient()->ICGetFileRequest(&result, m_access->m_session, url.c_str(),
-                                                                temp.c_str(), CompletionCallback, m_ticket);
-            if (result != 0 || !m_request) {
-                Log(OENetLogError, "***VRN: ICGetFileRequest returns %d", static_cast<int>(result));
-                status = OENetRequestFailed;
-            } else {
-                status = Transfer(false, nullptr, nullptr);
-            }
-        }
+        status = Begin(false, nullptr, nullptr, nullptr);
     }
     Log(OENetLogDetail, "VRN: End get from %s, netstatus %d", url.c_str(), static_cast<int>(status));
     m_request = nullptr;
     return status;
+}
+
+// Opens the session when needed, makes the client request for m_url (a POST of body, or a GET)
+// and carries it through Transfer.
+OENetStatus VRNNetRequest::Begin(bool post, OEBuffer* body, const char* contentType, const char* headers) {
+    OEString temp = m_access->GetTempFilePath();
+    OENetStatus status = m_access->OpenInternetIfNeeded();
+    if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
+    if (status != OENetOK) return status;
+    OEHttpClient* client = m_access->GetClient();
+    long result = 0;
+    if (post) {
+        const char* bytes = body && body->GetBufferPtr() ? body->GetBufferPtr() : "";
+        unsigned long length = body && body->GetBufferPtr() ? body->GetBufferSize() : 0;
+        m_request = client->ICSendDataRequest(&result, m_access->m_session, m_url.c_str(), bytes, length,
+                                              temp.c_str(), CompletionCallback, m_ticket);
+    } else {
+        m_request = client->ICGetFileRequest(&result, m_access->m_session, m_url.c_str(), temp.c_str(),
+                                             CompletionCallback, m_ticket);
+    }
+    if (result != 0 || !m_request) {
+        Log(OENetLogError, post ? "***VRN ICSendDataRequest:  %d" : "***VRN: ICGetFileRequest returns %d",
+            static_cast<int>(result));
+        return OENetRequestFailed;
+    }
+    return Transfer(post, contentType, headers);
 }
 
 // Steps after the client made the request: TLS settings, HTTP settings, start, wait, results.
