@@ -512,9 +512,88 @@ unsigned short OETransRs::AllRequiredPresent() {
     return RequiredInnerPresent(*this, *r, true);
 }
 
+// ---------------------------------------------------------------- OESyncBase
+
+OESyncBase::OESyncBase(unsigned short version, bool request)
+    : OEAggregate(version), m_trans(1, 5), m_request(request) {}
+
+unsigned short OESyncBase::SetAccount(OEDataObj* account) {
+    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
+    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
+                       account);
+}
+
+unsigned short OESyncBase::StoreTrans(unsigned short index, OETransWrapper* trans, bool append) {
+    if (!trans) return 0;
+    if (append) {
+        if (!m_trans.Append(trans)) return 0;
+    } else if (index > m_trans.Entries() || !m_trans.Set(index, trans)) {
+        return 0;
+    }
+    if (trans->GetType()) SetTag(trans->GetType());
+    return 1;
+}
+
+OEParseStatus OESyncBase::PushTranObject(const OETagDictionaryEntry* entry) {
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return OEPS_NORESOURCE;
+    OETransWrapper* trans = m_request ? static_cast<OETransWrapper*>(factory->NewTransRq(GetMsgSetVersion()))
+                                      : static_cast<OETransWrapper*>(factory->NewTransRs(GetMsgSetVersion()));
+    if (trans) {
+        trans->SetType(entry->m_id);
+        trans->m_msgsTag = m_msgsTag;
+    }
+    return AdoptListChild(this, m_trans, trans, entry->m_id);
+}
+
+OEParseStatus OESyncBase::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    if (IsSyncWrapper(entry->m_id, !m_request)) return PushTranObject(entry);
+    return OEAggregate::HandleTagStart(entry);
+}
+
+int OESyncBase::Build(OEBuilder* builder) {
+    int status = OEAggregate::Build(builder);
+    if (status != OEBS_OK) return status;
+    return BuildEach(this, builder, m_trans);
+}
+
+OEDataObj* OESyncBase::GetChild(unsigned short index) const {
+    unsigned short own = OEAggregate::GetNumberOfChildren();
+    if (index < own) return OEAggregate::GetChild(index);
+    return m_trans.Get(static_cast<unsigned short>(index - own));
+}
+
+unsigned short OESyncBase::GetNumberOfChildren() const {
+    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
+}
+
+// Copies the wrappers (their own tags and children included) through the factory.
+unsigned short OESyncBase::CopyExtraFrom(const OEAggregate* other) {
+    const OESyncBase* src = static_cast<const OESyncBase*>(other);
+    m_msgsTag = src->m_msgsTag;
+    m_trans.DeleteAll();
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return 0;
+    for (unsigned short i = 0; i < src->m_trans.Entries(); ++i) {
+        const OEAggregate* from = static_cast<const OEAggregate*>(src->m_trans.Get(i));
+        if (!from) continue;
+        unsigned short v = from->GetMsgSetVersion();
+        OEAggregate* copy = m_request ? static_cast<OEAggregate*>(factory->NewTransRq(v))
+                                      : static_cast<OEAggregate*>(factory->NewTransRs(v));
+        if (!copy) return 0;
+        if (!m_trans.Append(copy)) {
+            delete copy;
+            return 0;
+        }
+        if (!copy->DeepCopyFrom(from)) return 0;
+    }
+    return 1;
+}
+
 // ---------------------------------------------------------------- OESyncRq
 
-OESyncRq::OESyncRq(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
+OESyncRq::OESyncRq(unsigned short version) : OESyncBase(version, true) {}
 const OEAggregateDesc& OESyncRq::Describe() const {
     return kSyncRqDesc;
 }
@@ -569,48 +648,6 @@ OETagID OESyncRq::MsgIDToSyncWrapper(OETagID tag) {
     }
 }
 
-unsigned short OESyncRq::SetAccount(OEDataObj* account) {
-    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
-                       account);
-}
-
-unsigned short OESyncRq::AppendTrans(OETransRq* trans) {
-    if (!trans || !m_trans.Append(trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-unsigned short OESyncRq::SetTrans(unsigned short index, OETransRq* trans) {
-    if (!trans || index > m_trans.Entries()) return 0;
-    if (!m_trans.Set(index, trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-OEParseStatus OESyncRq::PushTranObject(const OETagDictionaryEntry* entry) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OETransRq* trans = factory->NewTransRq(GetMsgSetVersion());
-    if (trans) {
-        trans->SetType(entry->m_id);
-        trans->SetMsgsRqTag(GetMsgsRqTag());
-    }
-    return AdoptListChild(this, m_trans, trans, entry->m_id);
-}
-
-OEParseStatus OESyncRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    if (IsSyncWrapper(entry->m_id, false)) return PushTranObject(entry);
-    return OEAggregate::HandleTagStart(entry);
-}
-
-int OESyncRq::Build(OEBuilder* builder) {
-    int status = OEAggregate::Build(builder);
-    if (status != OEBS_OK) return status;
-    return BuildEach(this, builder, m_trans);
-}
-
 unsigned short OESyncRq::AllRequiredPresent() {
     if (!ValidateTag(OETAG_REJECTIFMISSING)) return 0;
     unsigned short token = ValidateTag(OETAG_TOKEN) ^ ValidateTag(OETAG_TOKEN2);
@@ -639,56 +676,11 @@ unsigned short OESyncRq::AllRequiredPresent() {
     }
 }
 
-OEDataObj* OESyncRq::GetChild(unsigned short index) const {
-    unsigned short own = OEAggregate::GetNumberOfChildren();
-    if (index < own) return OEAggregate::GetChild(index);
-    return m_trans.Get(static_cast<unsigned short>(index - own));
-}
-
-unsigned short OESyncRq::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
-}
-
 // ---------------------------------------------------------------- OESyncRs
 
-OESyncRs::OESyncRs(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
+OESyncRs::OESyncRs(unsigned short version) : OESyncBase(version, false) {}
 const OEAggregateDesc& OESyncRs::Describe() const {
     return kSyncRsDesc;
-}
-
-unsigned short OESyncRs::SetAccount(OEDataObj* account) {
-    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
-                       account);
-}
-
-unsigned short OESyncRs::AppendTrans(OETransRs* trans) {
-    if (!trans || !m_trans.Append(trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-OEParseStatus OESyncRs::PushTranObject(const OETagDictionaryEntry* entry) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OETransRs* trans = factory->NewTransRs(GetMsgSetVersion());
-    if (trans) {
-        trans->SetType(entry->m_id);
-        trans->SetMsgsRsTag(GetMsgsRsTag());
-    }
-    return AdoptListChild(this, m_trans, trans, entry->m_id);
-}
-
-OEParseStatus OESyncRs::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    if (IsSyncWrapper(entry->m_id, true)) return PushTranObject(entry);
-    return OEAggregate::HandleTagStart(entry);
-}
-
-int OESyncRs::Build(OEBuilder* builder) {
-    int status = OEAggregate::Build(builder);
-    if (status != OEBS_OK) return status;
-    return BuildEach(this, builder, m_trans);
 }
 
 unsigned short OESyncRs::AllRequiredPresent() {
@@ -715,51 +707,4 @@ unsigned short OESyncRs::AllRequiredPresent() {
     default:
         return 1;
     }
-}
-
-OEDataObj* OESyncRs::GetChild(unsigned short index) const {
-    unsigned short own = OEAggregate::GetNumberOfChildren();
-    if (index < own) return OEAggregate::GetChild(index);
-    return m_trans.Get(static_cast<unsigned short>(index - own));
-}
-
-unsigned short OESyncRs::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
-}
-
-namespace {
-
-// Copies a list of wrappers (the wrappers' own tags and children included) through the factory.
-template <class T> unsigned short CopyWrappers(OEDataObjList& to, const OEDataObjList& from, bool request) {
-    to.DeleteAll();
-    OEDataObjFactory* factory = OEDataObj::GetFactory();
-    if (!factory) return 0;
-    for (unsigned short i = 0; i < from.Entries(); ++i) {
-        const T* src = static_cast<const T*>(from.Get(i));
-        if (!src) continue;
-        T* copy =
-            request ? static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRq(src->GetMsgSetVersion())))
-                    : static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRs(src->GetMsgSetVersion())));
-        if (!copy) return 0;
-        if (!to.Append(copy)) {
-            delete copy;
-            return 0;
-        }
-        if (!copy->DeepCopyFrom(src)) return 0;
-    }
-    return 1;
-}
-
-} // namespace
-
-unsigned short OESyncRq::CopyExtraFrom(const OEAggregate* other) {
-    const OESyncRq* src = static_cast<const OESyncRq*>(other);
-    m_msgsTag = src->m_msgsTag;
-    return CopyWrappers<OETransRq>(m_trans, src->m_trans, true);
-}
-
-unsigned short OESyncRs::CopyExtraFrom(const OEAggregate* other) {
-    const OESyncRs* src = static_cast<const OESyncRs*>(other);
-    m_msgsTag = src->m_msgsTag;
-    return CopyWrappers<OETransRs>(m_trans, src->m_trans, false);
 }

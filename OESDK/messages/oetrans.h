@@ -138,15 +138,54 @@ public:
     OEOwnedChild m_status, m_warning;
 };
 
-// Every synchronisation request (...SYNCRQ).
-class OE_API OESyncRq : public OEAggregate {
+// The common part of the synchronisation request and response: TOKEN / TOKEN2, the account, the
+// transaction wrappers listed after the elements, and the enclosing set's tag. `request` selects
+// the side.
+class OE_API OESyncBase : public OEAggregate {
 public:
-    explicit OESyncRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    OESyncBase(unsigned short version, bool request);
     const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
     unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
     const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
     unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
+    OEDataObj* GetAccount() const { return m_account.get(); }
+    // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
+    unsigned short SetAccount(OEDataObj* account);
+    unsigned short GetNumTrans() const { return m_trans.Entries(); }
+    void DeleteAllTrans() { m_trans.DeleteAll(); }
+
+    // A transaction wrapper of the side goes to the list; any other tag as the rows say.
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    // The rows, then the wrappers.
+    int Build(OEBuilder* builder) override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    // The set's tag and the wrappers.
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
+
+    OEString m_token, m_token2;
+    unsigned short m_kestRefresh = 0;
+    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    OEOwnedChild m_account;
+    OEDataObjList m_trans;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // Appends a wrapper, or replaces the one at index (an index above the count is refused), and
+    // marks its tag. A null wrapper is refused (0).
+    unsigned short StoreTrans(unsigned short index, OETransWrapper* trans, bool append);
+
+    bool m_request;
+
+private:
+    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
+};
+
+// Every synchronisation request (...SYNCRQ).
+class OE_API OESyncRq : public OESyncBase {
+public:
+    explicit OESyncRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
     unsigned short GetTokenOnly() const { return static_cast<unsigned short>(GetNumber(OETAG_TOKENONLY)); }
     unsigned short SetTokenOnly(unsigned short v) { return SetNumber(OETAG_TOKENONLY, v); }
     unsigned short GetRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_REFRESH)); }
@@ -168,77 +207,39 @@ public:
     }
     unsigned short SetKestRefresh(unsigned short v) { return SetNumber(OETAG_KEST_REFRESH, v); }
     unsigned short SetKestSyncError(unsigned long v) { return SetNumber(OETAG_KEST_SYNCERROR, v); }
-    OEDataObj* GetAccount() const { return m_account.get(); }
-    // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
-    unsigned short SetAccount(OEDataObj* account);
-    unsigned short AppendTrans(OETransRq* trans);
-    unsigned short SetTrans(unsigned short index, OETransRq* trans);
+    unsigned short AppendTrans(OETransRq* trans) { return StoreTrans(0, trans, true); }
+    unsigned short SetTrans(unsigned short index, OETransRq* trans) {
+        return StoreTrans(index, trans, false);
+    }
     OETransRq* GetTrans(unsigned short index) const { return static_cast<OETransRq*>(m_trans.Get(index)); }
-    unsigned short GetNumTrans() const { return m_trans.Entries(); }
-    void DeleteAllTrans() { m_trans.DeleteAll(); }
     OETagID GetMsgsRqTag() const { return m_msgsTag; }
     void SetMsgsRqTag(OETagID tag) { m_msgsTag = tag; }
     // Inner request tag to its synchronisation wrapper; 0 for any other tag.
     static OETagID MsgIDToSyncWrapper(OETagID tag);
 
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    int Build(OEBuilder* builder) override;
     unsigned short AllRequiredPresent() override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
-    OEString m_token, m_token2;
     unsigned short m_tokenOnly = 0, m_refresh = 0, m_rejectIfMissing = 0, m_incImages = 0, m_useHtml = 0;
-    unsigned short m_kestRefresh = 0;
-    unsigned long m_syncError = 0, m_kestSyncError = 0;
-    OEOwnedChild m_account;
-    OEDataObjList m_trans;
-    OETagID m_msgsTag = OETAG_NONE;
-
-private:
-    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
 };
 
 // Every synchronisation response (...SYNCRS).
-class OE_API OESyncRs : public OEAggregate {
+class OE_API OESyncRs : public OESyncBase {
 public:
     explicit OESyncRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
-    unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
-    const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
-    unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
     unsigned short GetLostSync() const { return static_cast<unsigned short>(GetNumber(OETAG_LOSTSYNC)); }
     unsigned short SetLostSync(unsigned short v) { return SetNumber(OETAG_LOSTSYNC, v); }
     const OEString* GetTranUID() const { return GetText(OETAG_TRNUID); }
     unsigned short SetTranUID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
-    OEDataObj* GetAccount() const { return m_account.get(); }
-    unsigned short SetAccount(OEDataObj* account);
-    unsigned short AppendTrans(OETransRs* trans);
+    unsigned short AppendTrans(OETransRs* trans) { return StoreTrans(0, trans, true); }
     OETransRs* GetTrans(unsigned short index) const { return static_cast<OETransRs*>(m_trans.Get(index)); }
-    unsigned short GetNumTrans() const { return m_trans.Entries(); }
-    void DeleteAllTrans() { m_trans.DeleteAll(); }
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
     void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
 
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    int Build(OEBuilder* builder) override;
     unsigned short AllRequiredPresent() override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
-    OEString m_token, m_token2;
-    unsigned short m_lostSync = 0, m_kestRefresh = 0;
-    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    unsigned short m_lostSync = 0;
     OEString36 m_trnUid;
-    OEOwnedChild m_account;
-    OEDataObjList m_trans;
-    OETagID m_msgsTag = OETAG_NONE;
-
-private:
-    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
 };
 
 // The response tag of a request tag (STMTRQ gives STMTRS, STMTTRNRQ gives STMTTRNRS); 0 when the
