@@ -135,32 +135,28 @@ protected:
     OEPtrArray<OEMessageSetBase> m_sets;
 };
 
-// OFX request body.
-class OE_API OERequest : public OERootBase {
+// The typed accessors of one side's root: Self is the root class, SetT its message-set class.
+template <class Self, class SetT> class OERootOf : public OERootBase {
 public:
-    explicit OERequest(unsigned short version = 0) : OERootBase(version, true) { SetType(OETAG_OFX); }
-    OEMessageSetRq* GetMessageSet(unsigned short index) const {
-        return static_cast<OEMessageSetRq*>(m_sets.Get(index));
-    }
-    unsigned short AppendMessageSet(OEMessageSetRq* set) { return Store(0, set, true); }
-    unsigned short SetMessageSet(unsigned short index, OEMessageSetRq* set) {
-        return Store(index, set, false);
-    }
-    unsigned short DeepCopyFrom(const OERequest* other) { return CopyFrom(other); }
+    SetT* GetMessageSet(unsigned short index) const { return static_cast<SetT*>(m_sets.Get(index)); }
+    unsigned short AppendMessageSet(SetT* set) { return Store(0, set, true); }
+    unsigned short SetMessageSet(unsigned short index, SetT* set) { return Store(index, set, false); }
+    unsigned short DeepCopyFrom(const Self* other) { return CopyFrom(other); }
+
+protected:
+    OERootOf(unsigned short version, bool request) : OERootBase(version, request) { SetType(OETAG_OFX); }
+};
+
+// OFX request body.
+class OE_API OERequest : public OERootOf<OERequest, OEMessageSetRq> {
+public:
+    explicit OERequest(unsigned short version = 0) : OERootOf(version, true) {}
 };
 
 // OFX response body.
-class OE_API OEResponse : public OERootBase {
+class OE_API OEResponse : public OERootOf<OEResponse, OEMessageSetRs> {
 public:
-    explicit OEResponse(unsigned short version = 0) : OERootBase(version, false) { SetType(OETAG_OFX); }
-    OEMessageSetRs* GetMessageSet(unsigned short index) const {
-        return static_cast<OEMessageSetRs*>(m_sets.Get(index));
-    }
-    unsigned short AppendMessageSet(OEMessageSetRs* set) { return Store(0, set, true); }
-    unsigned short SetMessageSet(unsigned short index, OEMessageSetRs* set) {
-        return Store(index, set, false);
-    }
-    unsigned short DeepCopyFrom(const OEResponse* other) { return CopyFrom(other); }
+    explicit OEResponse(unsigned short version = 0) : OERootOf(version, false) {}
 };
 
 #endif
