@@ -203,18 +203,14 @@ std::atomic<std::uintptr_t> g_nextHandle{1};
 ICRequest OEHttpClientBase::ICSendDataRequest(long* result, ICSession session, const char* url,
                                               const char* body, unsigned long length, const char* tempDir,
                                               ICCompletionCallback callback, void* context) {
-    ICRequestBase* r = Make(result, session, url, tempDir, callback, context);
-    if (r) {
-        r->post = true;
-        if (body && length) r->body.assign(body, length);
-    }
+    ICRequestBase* r = Make(result, session, url, tempDir, callback, context, true, body, length);
     return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
 }
 
 ICRequest OEHttpClientBase::ICGetFileRequest(long* result, ICSession session, const char* url,
                                              const char* tempDir, ICCompletionCallback callback,
                                              void* context) {
-    ICRequestBase* r = Make(result, session, url, tempDir, callback, context);
+    ICRequestBase* r = Make(result, session, url, tempDir, callback, context, false, nullptr, 0);
     return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
 }
 
@@ -230,8 +226,12 @@ long OEHttpClientBase::ICSetHTTPInfo(ICRequest request, long, long post, const c
     std::shared_ptr<ICRequestBase> r = Find(request);
     if (!r) return 12018;
     if (post && !r->post) return 87; // a get cannot become a post here
-    r->contentType = contentType ? contentType : "";
-    r->extraHeaders = extraHeaders ? extraHeaders : "";
+    try {
+        r->contentType = contentType ? contentType : "";
+        r->extraHeaders = extraHeaders ? extraHeaders : "";
+    } catch (...) {
+        return 8;
+    }
     r->noCache = noCache;
     r->timeout = timeout < 0 ? 0 : timeout;
     return 0;
@@ -242,7 +242,11 @@ long OEHttpClientBase::ICAddTrustedRoot(ICRequest request, const unsigned char* 
     std::shared_ptr<ICRequestBase> r = Find(request);
     if (!r) return 12018;
     if (!der || !length) return 87;
-    r->roots.push_back(ICRoot{std::vector<unsigned char>(der, der + length), rootId});
+    try {
+        r->roots.push_back(ICRoot{std::vector<unsigned char>(der, der + length), rootId});
+    } catch (...) {
+        return 8;
+    }
     return 0;
 }
 
@@ -309,21 +313,32 @@ void ICRequestBase::Finish(unsigned long code) {
 }
 
 ICRequestBase* OEHttpClientBase::Make(long* result, ICSession session, const char* url, const char* tempDir,
-                                      ICCompletionCallback callback, void* context) {
+                                      ICCompletionCallback callback, void* context, bool post,
+                                      const char* body, unsigned long length) {
     ICSessionBase* s = static_cast<ICSessionBase*>(session);
     if (result) *result = 0;
     if (!s || !url || !*url) {
         if (result) *result = 87;
         return nullptr;
     }
-    std::shared_ptr<ICRequestBase> r = NewRequest(*s);
+    // Out of memory (the shared pointer's block, the copies of the texts and of the body) is 8.
+    std::shared_ptr<ICRequestBase> r;
+    try {
+        r = NewRequest(*s);
+        if (r) {
+            r->url = url;
+            r->tempDir = tempDir ? tempDir : "";
+            r->post = post;
+            if (body && length) r->body.assign(body, length);
+        }
+    } catch (...) {
+        r = nullptr;
+    }
     if (!r) {
         if (result) *result = 8;
         return nullptr;
     }
     r->handle = g_nextHandle.fetch_add(1);
-    r->url = url;
-    r->tempDir = tempDir ? tempDir : "";
     r->callback = callback;
     r->context = context;
     ICRequestBase* raw = r.get();
@@ -341,8 +356,14 @@ ICRequestBase* OEHttpClientBase::Make(long* result, ICSession session, const cha
             ++i;
         }
     }
-    m_live[raw->handle] = r;
-    s->requests.push_back(std::move(r));
+    try {
+        s->requests.push_back(r);
+        m_live[raw->handle] = r;
+    } catch (...) {
+        if (!s->requests.empty() && s->requests.back() == r) s->requests.pop_back();
+        if (result) *result = 8;
+        return nullptr;
+    }
     return raw;
 }
 

@@ -3,7 +3,8 @@
 // when the next request is made), takes the request's settings (ICSetSSLInfo, ICSetHTTPInfo,
 // ICAddTrustedRoot, ICSetCertificateCallback), starts and cancels transfers, and ends them with
 // the one completion callback. A client of one OS adds its own session and request members and
-// the transfer itself.
+// the transfer itself. Running out of memory answers 8, as the Windows error of that name; no
+// exception leaves an IC... operation.
 #ifndef OESDK_PLATFORM_INTERNAL_OEHTTPCLIENTBASE_H
 #define OESDK_PLATFORM_INTERNAL_OEHTTPCLIENTBASE_H
 
@@ -96,8 +97,10 @@ protected:
     std::mutex m_lock; // guards m_live and the derived client's trust store
 
 private:
+    // A registered request of a session: *result 0, or 87 for a bad argument, 8 out of memory.
     ICRequestBase* Make(long* result, ICSession session, const char* url, const char* tempDir,
-                        ICCompletionCallback callback, void* context);
+                        ICCompletionCallback callback, void* context, bool post, const char* body,
+                        unsigned long length);
     std::shared_ptr<ICRequestBase> Find(ICRequest request);
 
     std::map<std::uintptr_t, std::shared_ptr<ICRequestBase>> m_live;
