@@ -119,28 +119,22 @@ public:
     OEBuildStatus W(__VA_ARGS__) override {                                                                  \
         return Mark(#W);                                                                                     \
     }
+    // clang-format off
     MARK(AddString, const OEString&, OEBuildStringMacroOpt, OEBuildStringCrLfOpt)
-    MARK(AddDayOfWeek, OEDayOfWeek)
-    MARK(AddProcCode, OEProcCode) MARK(AddInvAcctType, const OEInvAcctType&)
-        MARK(AddDebtType, const OEDebtType&) MARK(AddDebtClass, const OEDebtClass&)
-            MARK(AddCallType, const OECallType&) MARK(AddMFType, const OEMFType&)
-                MARK(AddOptType, const OEOptType&) MARK(AddStockType,
-                                                        const OEStockType&) MARK(AddBuyType, const OEBuyType&)
-                    MARK(AddIncomeType, const OEIncomeType&) MARK(AddOptAction, const OEOptAction&)
-                        MARK(AddOptBuyType, const OEOptBuyType&) MARK(AddOptSellType, const OEOptSellType&)
-                            MARK(AddPosType, const OEPosType&) MARK(AddRelType, const OERelType&)
-                                MARK(AddSecured, const OESecured&) MARK(AddSellReason, const OESellReason&)
-                                    MARK(AddSellType, const OESellType&) MARK(AddSubAcct, const OESubAcct&)
-                                        MARK(AddTferAction, const OETferAction&)
-                                            MARK(AddUnitType, const OEUnitType&)
-                                                MARK(AddDuration, const OEDuration&)
-                                                    MARK(AddRestriction, const OERestriction&)
-                                                        MARK(AddBalType, const OEBalType&)
-                                                            MARK(AddAssetClass, const OEAssetClass&)
-                                                                MARK(AddCouponFreq, const OECouponFreq&)
-                                                                    MARK(AddUnitPrice,
-                                                                         const OEPosPrecisionInteger&)
-                                                                        MARK(AddRate, OEPercent)
+    MARK(AddDayOfWeek, OEDayOfWeek) MARK(AddProcCode, OEProcCode) MARK(AddInvAcctType, const OEInvAcctType&)
+    MARK(AddDebtType, const OEDebtType&) MARK(AddDebtClass, const OEDebtClass&)
+    MARK(AddCallType, const OECallType&) MARK(AddMFType, const OEMFType&) MARK(AddOptType, const OEOptType&)
+    MARK(AddStockType, const OEStockType&) MARK(AddBuyType, const OEBuyType&)
+    MARK(AddIncomeType, const OEIncomeType&) MARK(AddOptAction, const OEOptAction&)
+    MARK(AddOptBuyType, const OEOptBuyType&) MARK(AddOptSellType, const OEOptSellType&)
+    MARK(AddPosType, const OEPosType&) MARK(AddRelType, const OERelType&) MARK(AddSecured, const OESecured&)
+    MARK(AddSellReason, const OESellReason&) MARK(AddSellType, const OESellType&)
+    MARK(AddSubAcct, const OESubAcct&) MARK(AddTferAction, const OETferAction&)
+    MARK(AddUnitType, const OEUnitType&) MARK(AddDuration, const OEDuration&)
+    MARK(AddRestriction, const OERestriction&) MARK(AddBalType, const OEBalType&)
+    MARK(AddAssetClass, const OEAssetClass&) MARK(AddCouponFreq, const OECouponFreq&)
+    MARK(AddUnitPrice, const OEPosPrecisionInteger&) MARK(AddRate, OEPercent)
+    // clang-format on
 #undef MARK
 };
 
