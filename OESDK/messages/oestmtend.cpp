@@ -139,14 +139,14 @@ const OEAggregateDesc& OECCClosing::Describe() const {
     return kCCClosingDesc;
 }
 
-OEStatementEndRq::OEStatementEndRq(unsigned short version) : OEStatementEndRqBase(version) {
+OEStatementEndRq::OEStatementEndRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTENDRQ);
 }
 const OEAggregateDesc& OEStatementEndRq::Describe() const {
     return kEndRqDesc;
 }
 
-OECCStatementEndRq::OECCStatementEndRq(unsigned short version) : OEStatementEndRqBase(version) {
+OECCStatementEndRq::OECCStatementEndRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTENDRQ);
 }
 const OEAggregateDesc& OECCStatementEndRq::Describe() const {
@@ -162,14 +162,14 @@ void OEStatementEndRsBase::DeleteAllClosing() {
             ClearTag(d.m_fields[i].m_tag);
 }
 
-OEStatementEndRs::OEStatementEndRs(unsigned short version) : OEStatementEndRsBase(version) {
+OEStatementEndRs::OEStatementEndRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTENDRS);
 }
 const OEAggregateDesc& OEStatementEndRs::Describe() const {
     return kEndRsDesc;
 }
 
-OECCStatementEndRs::OECCStatementEndRs(unsigned short version) : OEStatementEndRsBase(version) {
+OECCStatementEndRs::OECCStatementEndRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTENDRS);
 }
 const OEAggregateDesc& OECCStatementEndRs::Describe() const {

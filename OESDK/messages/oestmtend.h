@@ -106,24 +106,29 @@ public:
     OEDateTime m_dtStart, m_dtEnd;
 };
 
+// Typed access to the FROM account of a statement-end aggregate: OEBankAccount for
+// BANKACCTFROM, OECCAccount for CCACCTFROM.
+template <class Base, class Account, OETagID Tag> class OEAccountFromOf : public Base {
+public:
+    explicit OEAccountFromOf(unsigned short version = 0) : Base(version) {}
+    Account* GetAccountFrom() const { return static_cast<Account*>(this->GetChildObj(Tag)); }
+    unsigned short SetAccountFrom(Account* account) { return this->SetChildObj(Tag, account); }
+};
+
 // STMTENDRQ.
-class OE_API OEStatementEndRq : public OEStatementEndRqBase {
+class OE_API OEStatementEndRq
+    : public OEAccountFromOf<OEStatementEndRqBase, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEStatementEndRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
 };
 
 // CCSTMTENDRQ.
-class OE_API OECCStatementEndRq : public OEStatementEndRqBase {
+class OE_API OECCStatementEndRq
+    : public OEAccountFromOf<OEStatementEndRqBase, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementEndRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
 };
 
 // The statement-end responses: CURDEF, the account and the closings in order.
@@ -141,14 +146,11 @@ public:
 };
 
 // STMTENDRS.
-class OE_API OEStatementEndRs : public OEStatementEndRsBase {
+class OE_API OEStatementEndRs
+    : public OEAccountFromOf<OEStatementEndRsBase, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEStatementEndRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
     unsigned short AppendClosing(OEClosing* c) { return AppendToList(OETAG_CLOSING, c); }
     OEClosing* GetClosing(unsigned short index) const {
         return static_cast<OEClosing*>(m_closings.Get(index));
@@ -156,12 +158,11 @@ public:
 };
 
 // CCSTMTENDRS.
-class OE_API OECCStatementEndRs : public OEStatementEndRsBase {
+class OE_API OECCStatementEndRs
+    : public OEAccountFromOf<OEStatementEndRsBase, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementEndRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
     unsigned short AppendClosing(OECCClosing* c) { return AppendToList(OETAG_CCCLOSING, c); }
     OECCClosing* GetClosing(unsigned short index) const {
         return static_cast<OECCClosing*>(m_closings.Get(index));
