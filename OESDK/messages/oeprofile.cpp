@@ -314,3 +314,8 @@ OEProfileRs::OEProfileRs(unsigned short version) : OETransBase(version) {
 const OEAggregateDesc& OEProfileRs::Describe() const {
     return kProfRsDesc;
 }
+
+unsigned short OEProfileRs::AllRequiredPresent() {
+    if (!OEAggregate::AllRequiredPresent()) return 0;
+    return ValidateTag(OETAG_ADDR3) && !ValidateTag(OETAG_ADDR2) ? 0 : 1;
+}

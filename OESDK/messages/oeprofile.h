@@ -202,6 +202,8 @@ class OE_API OEProfileRs : public OETransBase {
 public:
     explicit OEProfileRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
+    // The required rows, and ADDR3 only together with ADDR2.
+    unsigned short AllRequiredPresent() override;
     OEMessageSetList* GetMessageSetList() const {
         return static_cast<OEMessageSetList*>(GetChildObj(OETAG_MSGSETLIST));
     }

@@ -185,6 +185,11 @@ const ClassRow kRows[] = {
          EXPECT_EQ(info->GetPasswordType(), 2);
          EXPECT_EQ(info->AllRequiredPresent(), 1);
          EXPECT_NE(rs->GetMessageSetList()->GetMessageSetProfile(OETAG_PROFMSGSET), nullptr);
+         rs->SetAddr3(OEString("Suite 9"));
+         rs->ClearTag(OETAG_ADDR2);
+         EXPECT_EQ(rs->AllRequiredPresent(), 0) << "ADDR3 only together with ADDR2";
+         rs->SetAddr2(OEString("Floor 2"));
+         rs->ClearTag(OETAG_ADDR3);
      }},
 };
 
