@@ -56,6 +56,8 @@
 #include "messages/oemsgset.h"
 #include "messages/oebank.h"
 #include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
+#include "messages/oechallenge.h"
 
 // Transport
 #include "net/oenetacc.h"

@@ -5,9 +5,11 @@
 #include "file/oefile.h"
 #include "foundation/oelanguage.h"
 #include "messages/oebank.h"
+#include "messages/oechallenge.h"
 #include "messages/oecurrency.h"
 #include "messages/oemsgset.h"
 #include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
 
 OEFile* OEDataObjFactory::NewFile(unsigned short version) {
     return Create<OEFile>(version);
@@ -122,4 +124,46 @@ OEMessageSetProfile* OEDataObjFactory::NewMessageSetProfile(unsigned short versi
 }
 OEMessageSetList* OEDataObjFactory::NewMessageSetList(unsigned short version) {
     return Create<OEMessageSetList>(version);
+}
+OEChallengeRs* OEDataObjFactory::NewChallengeRs(unsigned short version) {
+    return Create<OEChallengeRs>(version);
+}
+OEChallengeRq* OEDataObjFactory::NewChallengeRq(unsigned short version) {
+    return Create<OEChallengeRq>(version);
+}
+OESignOnInfo* OEDataObjFactory::NewSignOnInfo(unsigned short version) {
+    return Create<OESignOnInfo>(version);
+}
+OESignOnInfoList* OEDataObjFactory::NewSignOnInfoList(unsigned short version) {
+    return Create<OESignOnInfoList>(version);
+}
+OEProfileRq* OEDataObjFactory::NewProfileRq(unsigned short version) {
+    return Create<OEProfileRq>(version);
+}
+OEProfileRs* OEDataObjFactory::NewProfileRs(unsigned short version) {
+    return Create<OEProfileRs>(version);
+}
+OEClosing* OEDataObjFactory::NewClosing(unsigned short version) {
+    return Create<OEClosing>(version);
+}
+OEStatementEndRs* OEDataObjFactory::NewStatementEndRs(unsigned short version) {
+    return Create<OEStatementEndRs>(version);
+}
+OEStatementEndRq* OEDataObjFactory::NewStatementEndRq(unsigned short version) {
+    return Create<OEStatementEndRq>(version);
+}
+OECCClosing* OEDataObjFactory::NewCCClosing(unsigned short version) {
+    return Create<OECCClosing>(version);
+}
+OECCStatementEndRs* OEDataObjFactory::NewCCStatementEndRs(unsigned short version) {
+    return Create<OECCStatementEndRs>(version);
+}
+OECCStatementEndRq* OEDataObjFactory::NewCCStatementEndRq(unsigned short version) {
+    return Create<OECCStatementEndRq>(version);
+}
+OEMultiTransRq* OEDataObjFactory::NewMultiTransRq(unsigned short version) {
+    return Create<OEMultiTransRq>(version);
+}
+OEMultiTransRs* OEDataObjFactory::NewMultiTransRs(unsigned short version) {
+    return Create<OEMultiTransRs>(version);
 }

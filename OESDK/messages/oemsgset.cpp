@@ -74,6 +74,16 @@ const std::vector<Family>& Families() {
     return families;
 }
 
+// A new transaction wrapper for a tag: the multiple interbank wrappers have classes of their own,
+// every other tag gets the plain wrapper.
+OEDataObj* NewWrapper(OEDataObjFactory* factory, bool request, OETagID tag, unsigned short version) {
+    if (request)
+        return tag == OETAG_MULTIINTERTRNRQ ? static_cast<OEDataObj*>(factory->NewMultiTransRq(version))
+                                            : static_cast<OEDataObj*>(factory->NewTransRq(version));
+    return tag == OETAG_MULTIINTERTRNRS ? static_cast<OEDataObj*>(factory->NewMultiTransRs(version))
+                                        : static_cast<OEDataObj*>(factory->NewTransRs(version));
+}
+
 // The valid rows of each wrapper, both sides, built once from the families.
 struct WrapperTables {
     OETagID m_wrapper;
@@ -236,10 +246,7 @@ OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
 OEParseStatus OEMessageSetBase::PushTranObject(OETagID tag) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    // MULTIINTERTRNRQ / RS have a class of their own that is not part of the library yet; the
-    // plain wrapper stands in for it until then.
-    OEDataObj* trans = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(GetMsgSetVersion()))
-                                 : static_cast<OEDataObj*>(factory->NewTransRs(GetMsgSetVersion()));
+    OEDataObj* trans = NewWrapper(factory, m_request, tag, GetMsgSetVersion());
     if (trans) {
         trans->SetType(tag);
         if (m_request)
@@ -343,8 +350,7 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
             unsigned short v = src ? src->GetMsgSetVersion() : 0;
             OEDataObj* fresh;
             if (pass == 0)
-                fresh = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(v))
-                                  : static_cast<OEDataObj*>(factory->NewTransRs(v));
+                fresh = NewWrapper(factory, m_request, src ? src->GetType() : OETAG_NONE, v);
             else
                 fresh = m_request ? static_cast<OEDataObj*>(factory->NewSyncRq(v))
                                   : static_cast<OEDataObj*>(factory->NewSyncRs(v));

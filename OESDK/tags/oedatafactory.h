@@ -54,6 +54,20 @@ class OECCStatementRq;
 class OEPayee;
 class OEPayee2;
 class OEWarning;
+class OEChallengeRs;
+class OEChallengeRq;
+class OESignOnInfo;
+class OESignOnInfoList;
+class OEProfileRq;
+class OEProfileRs;
+class OEClosing;
+class OEStatementEndRs;
+class OEStatementEndRq;
+class OECCClosing;
+class OECCStatementEndRs;
+class OECCStatementEndRq;
+class OEMultiTransRq;
+class OEMultiTransRs;
 
 class OE_API OEDataObjFactory {
 public:
@@ -89,17 +103,26 @@ public:
     virtual OETransRs* NewTransRs(unsigned short version);
     virtual OESignOnRs* NewSignOnRs(unsigned short version);
     virtual OESignOnRq* NewSignOnRq(unsigned short version);
+    virtual OEChallengeRs* NewChallengeRs(unsigned short version);
+    virtual OEChallengeRq* NewChallengeRq(unsigned short version);
     virtual OEFI* NewFI(unsigned short version);
     virtual OEPinChangeRq* NewPinChangeRq(unsigned short version);
     virtual OEPinChangeRs* NewPinChangeRs(unsigned short version);
     virtual OEMessageSetCore* NewMessageSetCore(unsigned short version);
     virtual OEMessageSetVersion* NewMessageSetVersion(unsigned short version);
     virtual OEMessageSetProfile* NewMessageSetProfile(unsigned short version);
+    virtual OESignOnInfo* NewSignOnInfo(unsigned short version);
     virtual OEMessageSetList* NewMessageSetList(unsigned short version);
+    virtual OESignOnInfoList* NewSignOnInfoList(unsigned short version);
+    virtual OEProfileRq* NewProfileRq(unsigned short version);
+    virtual OEProfileRs* NewProfileRs(unsigned short version);
     virtual OEBalance* NewBalance(unsigned short version);
     virtual OEBankAccount* NewBankAccount(unsigned short version);
     virtual OEBankStatementRs* NewBankStatementRs(unsigned short version);
     virtual OEBankStatementRq* NewBankStatementRq(unsigned short version);
+    virtual OEClosing* NewClosing(unsigned short version);
+    virtual OEStatementEndRs* NewStatementEndRs(unsigned short version);
+    virtual OEStatementEndRq* NewStatementEndRq(unsigned short version);
     virtual OEBankStatementTx* NewBankStatementTx(unsigned short version);
     virtual OEIncTransaction* NewIncTransaction(unsigned short version);
     virtual OELedgerBalance* NewLedgerBalance(unsigned short version);
@@ -108,8 +131,13 @@ public:
     virtual OECCAccount* NewCCAccount(unsigned short version);
     virtual OECCStatementRs* NewCCStatementRs(unsigned short version);
     virtual OECCStatementRq* NewCCStatementRq(unsigned short version);
+    virtual OECCClosing* NewCCClosing(unsigned short version);
+    virtual OECCStatementEndRs* NewCCStatementEndRs(unsigned short version);
+    virtual OECCStatementEndRq* NewCCStatementEndRq(unsigned short version);
     virtual OEPayee* NewPayee(unsigned short version);
     virtual OEPayee2* NewPayee2(unsigned short version);
+    virtual OEMultiTransRq* NewMultiTransRq(unsigned short version);
+    virtual OEMultiTransRs* NewMultiTransRs(unsigned short version);
     virtual OEWarning* NewWarning(unsigned short version);
     // The next creation operations go here, each added by the change that brings its class,
     // strictly in this order so that the slot order never changes: NewFile, NewFileRq, NewFileRs,
