@@ -56,6 +56,7 @@
 #include "messages/oemsgset.h"
 #include "messages/oebank.h"
 #include "messages/oeprofile.h"
+#include "messages/oeseclist.h"
 
 // Transport
 #include "net/oenetacc.h"

@@ -5,6 +5,7 @@
 #include "foundation/oethread.h"
 #include "messages/oeaccount.h"
 #include "messages/oebank.h"
+#include "messages/oeseclist.h"
 #include "messages/oesignon.h"
 
 #include <cstdlib>
@@ -134,6 +135,7 @@ const OEFieldRow kTransRqFields[] = {
     {OETAG_STMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewBankStatementRq)},
     {OETAG_CCSTMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementRq)},
     {OETAG_PINCHRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewPinChangeRq)},
+    {OETAG_SECLISTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewSecListRq)},
 };
 
 // ---- transaction response wrapper ----
@@ -147,6 +149,7 @@ const OEFieldRow kTransRsFields[] = {
     {OETAG_STMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewBankStatementRs)},
     {OETAG_CCSTMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementRs)},
     {OETAG_PINCHRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewPinChangeRs)},
+    {OETAG_SECLISTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewSecListRs)},
 };
 
 // ---- STATUS ----
