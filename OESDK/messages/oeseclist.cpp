@@ -43,6 +43,11 @@ const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
         OETAG_FIASSETCLASS, OEFK_TEXT, OE_MEMBER(C, m_fiAssetClass), nullptr, nullptr                        \
     }
 
+#define OE_YIELD_ROWS(C)                                                                                     \
+    {OETAG_YIELD, OEFK_AMOUNT, OE_MEMBER(C, m_yield), nullptr, nullptr}, {                                   \
+        OETAG_DTYIELDASOF, OEFK_DATETIME, OE_MEMBER(C, m_dtYieldAsOf), nullptr, nullptr                      \
+    }
+
 // ---- SECID ----
 const OETagRow kSecIdValid[] = {{OETAG_UNIQUEID, OEVM_ALL, 0}, {OETAG_UNIQUEIDTYPE, OEVM_ALL, 0}};
 const OEFieldRow kSecIdFields[] = {
@@ -122,8 +127,7 @@ const OETagRow kSecInfoOnly[] = {{OETAG_SECINFO, OEVM_ALL, 0}};
 const OEFieldRow kMFFields[] = {
     OE_SECINFO_ROW(OEMFInfo),
     {OETAG_MFTYPE, OEFK_ENUM, OE_MEMBER(OEMFInfo, m_mfType), &kMFTypeTable, nullptr},
-    {OETAG_YIELD, OEFK_AMOUNT, OE_MEMBER(OEMFInfo, m_yield), nullptr, nullptr},
-    {OETAG_DTYIELDASOF, OEFK_DATETIME, OE_MEMBER(OEMFInfo, m_dtYieldAsOf), nullptr, nullptr},
+    OE_YIELD_ROWS(OEMFInfo),
     {OETAG_MFASSETCLASS, OEFK_CHILD, OE_MEMBER(OEMFInfo, m_mfAssetClass), nullptr, OE_MAKE(NewMFAssetClass)},
     {OETAG_FIMFASSETCLASS, OEFK_CHILD, OE_MEMBER(OEMFInfo, m_fiMfAssetClass), nullptr,
      OE_MAKE(NewFIMFAssetClass)},
@@ -168,8 +172,7 @@ const OETagRow kStockValid[] = {{OETAG_SECINFO, OEVM_ALL, 0},     {OETAG_STOCKTY
 const OEFieldRow kStockFields[] = {
     OE_SECINFO_ROW(OEStockInfo),
     {OETAG_STOCKTYPE, OEFK_ENUM, OE_MEMBER(OEStockInfo, m_stockType), &kStockTypeTable, nullptr},
-    {OETAG_YIELD, OEFK_AMOUNT, OE_MEMBER(OEStockInfo, m_yield), nullptr, nullptr},
-    {OETAG_DTYIELDASOF, OEFK_DATETIME, OE_MEMBER(OEStockInfo, m_dtYieldAsOf), nullptr, nullptr},
+    OE_YIELD_ROWS(OEStockInfo),
     {OETAG_TYPEDESC, OEFK_TEXT, OE_MEMBER(OEStockInfo, m_typeDesc), nullptr, nullptr},
     OE_ASSETCLASS_ROWS(OEStockInfo),
 };

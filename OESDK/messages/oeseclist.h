@@ -65,8 +65,9 @@ public:
 };
 
 // The common part of the five security descriptions: the SECINFO they all start with and the
-// asset class elements. MFINFO has no ASSETCLASS or FIASSETCLASS of its own (its mix is in
-// MFASSETCLASS / FIMFASSETCLASS): for it those accessors answer 0 and null.
+// elements several of them share. A kind without one of those elements refuses to set it (0) and
+// answers 0 or null: MFINFO has no ASSETCLASS or FIASSETCLASS of its own (its mix is in
+// MFASSETCLASS / FIMFASSETCLASS); only MFINFO and STOCKINFO have YIELD and DTYIELDASOF.
 class OE_API OESecurityInfo : public OEAggregate {
 public:
     explicit OESecurityInfo(unsigned short version = 0) : OEAggregate(version) {}
@@ -79,10 +80,18 @@ public:
     }
     const OEString* GetFIAssetClass() const { return GetText(OETAG_FIASSETCLASS); }
     unsigned short SetFIAssetClass(const OEString& v) { return SetFromText(OETAG_FIASSETCLASS, v); }
+    const OEPrecisionInteger* GetYield() const { return GetAmount(OETAG_YIELD); }
+    unsigned short SetYield(const OEString& v) { return SetFromText(OETAG_YIELD, v); }
+    unsigned short SetYield(const OEPrecisionInteger& v) { return SetAmount(OETAG_YIELD, v); }
+    const OEDateTime* GetDateYieldAsOf() const { return GetDateTime(OETAG_DTYIELDASOF); }
+    unsigned short SetDateYieldAsOf(const OEString& v) { return SetFromText(OETAG_DTYIELDASOF, v); }
+    unsigned short SetDateYieldAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTYIELDASOF, v); }
 
     OEOwnedChild m_secInfo;
     unsigned short m_assetClass = 0;
     OEString32 m_fiAssetClass;
+    OEPrecisionInteger m_yield;
+    OEDateTime m_dtYieldAsOf;
 };
 
 // DEBTINFO: a bond. COUPONFREQ also accepts the spellings "SEMIANNUALLY" and "ANUALLY" that some
@@ -211,12 +220,6 @@ public:
     OEMFType GetMFType() const { return static_cast<OEMFType>(GetNumber(OETAG_MFTYPE)); }
     unsigned short SetMFType(const OEString& v) { return SetFromText(OETAG_MFTYPE, v); }
     unsigned short SetMFType(OEMFType v) { return SetNumber(OETAG_MFTYPE, static_cast<unsigned long>(v)); }
-    const OEPrecisionInteger* GetYield() const { return GetAmount(OETAG_YIELD); }
-    unsigned short SetYield(const OEString& v) { return SetFromText(OETAG_YIELD, v); }
-    unsigned short SetYield(const OEPrecisionInteger& v) { return SetAmount(OETAG_YIELD, v); }
-    const OEDateTime* GetDateYieldAsOf() const { return GetDateTime(OETAG_DTYIELDASOF); }
-    unsigned short SetDateYieldAsOf(const OEString& v) { return SetFromText(OETAG_DTYIELDASOF, v); }
-    unsigned short SetDateYieldAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTYIELDASOF, v); }
     OEMFAssetClass* GetMFAssetClass() const {
         return static_cast<OEMFAssetClass*>(GetChildObj(OETAG_MFASSETCLASS));
     }
@@ -227,8 +230,6 @@ public:
     unsigned short SetFIMFAssetClass(OEFIMFAssetClass* c) { return SetChildObj(OETAG_FIMFASSETCLASS, c); }
 
     unsigned short m_mfType = 0;
-    OEPrecisionInteger m_yield;
-    OEDateTime m_dtYieldAsOf;
     OEOwnedChild m_mfAssetClass, m_fiMfAssetClass;
 };
 
@@ -282,18 +283,10 @@ public:
     unsigned short SetStockType(OEStockType v) {
         return SetNumber(OETAG_STOCKTYPE, static_cast<unsigned long>(v));
     }
-    const OEPrecisionInteger* GetYield() const { return GetAmount(OETAG_YIELD); }
-    unsigned short SetYield(const OEString& v) { return SetFromText(OETAG_YIELD, v); }
-    unsigned short SetYield(const OEPrecisionInteger& v) { return SetAmount(OETAG_YIELD, v); }
-    const OEDateTime* GetDateYieldAsOf() const { return GetDateTime(OETAG_DTYIELDASOF); }
-    unsigned short SetDateYieldAsOf(const OEString& v) { return SetFromText(OETAG_DTYIELDASOF, v); }
-    unsigned short SetDateYieldAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTYIELDASOF, v); }
     const OEString* GetTypeDesc() const { return GetText(OETAG_TYPEDESC); }
     unsigned short SetTypeDesc(const OEString& v) { return SetFromText(OETAG_TYPEDESC, v); }
 
     unsigned short m_stockType = 0;
-    OEPrecisionInteger m_yield;
-    OEDateTime m_dtYieldAsOf;
     OEString32 m_typeDesc;
 };
 
