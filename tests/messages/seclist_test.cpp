@@ -335,4 +335,34 @@ TEST(SecList, RequestWrapperMakesTheListRequest) {
     EXPECT_EQ(set->AllRequiredPresent(), 1);
 }
 
+int g_left = 0;
+int FailAfterN(std::size_t) {
+    return g_left-- > 0 ? 0 : 1;
+}
+
+// Failing the n-th allocation of a parse or a deep copy, for a range of n: a status, never a crash or
+// a leak; a copy that reports success with no error recorded is whole.
+TEST(SecList, RunningOutOfMemoryInAParseOrACopyIsReported) {
+    OEParseStatus status;
+    std::unique_ptr<OEFileRs> whole = Parse(kSecListSet, &status);
+    OEResponse* source = whole->GetResponse(0);
+    for (int allowed = 0; allowed < 240; allowed += 3) {
+        std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+        std::unique_ptr<OEResponse> copy(F()->NewResponse(0));
+        OEMemory::FailureHook previous = OEMemory::SetFailureHook(&FailAfterN);
+        g_left = allowed;
+        status = ParseInto(kSecListSet, file.get());
+        OEThreadState::SetErrorCode(OETE_NONE);
+        g_left = allowed;
+        unsigned short copied = copy->DeepCopyFrom(source);
+        OEMemory::SetFailureHook(previous);
+        EXPECT_TRUE(status == OEPS_NORESOURCE || status == OEPS_WARNINGS || status == OEPS_INVALID)
+            << allowed << ": " << status;
+        if (copied && OEThreadState::GetErrorCode() == OETE_NONE) {
+            EXPECT_EQ(BuildText(copy.get()), BuildText(source)) << allowed;
+        }
+        OEThreadState::SetErrorCode(OETE_NONE);
+    }
+}
+
 } // namespace
