@@ -58,6 +58,7 @@
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
 #include "messages/oechallenge.h"
+#include "messages/oeseclist.h"
 
 // Transport
 #include "net/oenetacc.h"

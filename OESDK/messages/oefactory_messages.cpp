@@ -10,6 +10,7 @@
 #include "messages/oemsgset.h"
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
+#include "messages/oeseclist.h"
 
 OEFile* OEDataObjFactory::NewFile(unsigned short version) {
     return Create<OEFile>(version);
@@ -166,4 +167,49 @@ OEMultiTransRq* OEDataObjFactory::NewMultiTransRq(unsigned short version) {
 }
 OEMultiTransRs* OEDataObjFactory::NewMultiTransRs(unsigned short version) {
     return Create<OEMultiTransRs>(version);
+}
+OEFIMFAssetClass* OEDataObjFactory::NewFIMFAssetClass(unsigned short version) {
+    return Create<OEFIMFAssetClass>(version);
+}
+OEMFAssetClass* OEDataObjFactory::NewMFAssetClass(unsigned short version) {
+    return Create<OEMFAssetClass>(version);
+}
+OEPortion* OEDataObjFactory::NewPortion(unsigned short version) {
+    return Create<OEPortion>(version);
+}
+OEFIPortion* OEDataObjFactory::NewFIPortion(unsigned short version) {
+    return Create<OEFIPortion>(version);
+}
+OEDebtInfo* OEDataObjFactory::NewDebtInfo(unsigned short version) {
+    return Create<OEDebtInfo>(version);
+}
+OEMFInfo* OEDataObjFactory::NewMFInfo(unsigned short version) {
+    return Create<OEMFInfo>(version);
+}
+OEOptInfo* OEDataObjFactory::NewOptInfo(unsigned short version) {
+    return Create<OEOptInfo>(version);
+}
+OEOtherInfo* OEDataObjFactory::NewOtherInfo(unsigned short version) {
+    return Create<OEOtherInfo>(version);
+}
+OEStockInfo* OEDataObjFactory::NewStockInfo(unsigned short version) {
+    return Create<OEStockInfo>(version);
+}
+OESecID* OEDataObjFactory::NewSecID(unsigned short version) {
+    return Create<OESecID>(version);
+}
+OESecInfo* OEDataObjFactory::NewSecInfo(unsigned short version) {
+    return Create<OESecInfo>(version);
+}
+OESecList* OEDataObjFactory::NewSecList(unsigned short version) {
+    return Create<OESecList>(version);
+}
+OESecRq* OEDataObjFactory::NewSecRq(unsigned short version) {
+    return Create<OESecRq>(version);
+}
+OESecListRs* OEDataObjFactory::NewSecListRs(unsigned short version) {
+    return Create<OESecListRs>(version);
+}
+OESecListRq* OEDataObjFactory::NewSecListRq(unsigned short version) {
+    return Create<OESecListRq>(version);
 }

@@ -55,9 +55,8 @@ const std::vector<Family>& Families() {
          OETAG_EMAILMSGSRQV2,
          {OETAG_MAILTRNRQ, OETAG_MAILSYNCRQ, OETAG_GETMIMETRNRQ},
          {}},
-        // The security list (SECLIST) of the response side is held by a class that is not part of
-        // the library yet; until it is, the parser skips it as not valid here.
-        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {}},
+        // The response side's SECLIST follows its wrappers.
+        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {OETAG_SECLIST}},
         {OETAG_PROFMSGSRQV1, OETAG_PROFMSGSRQV2, {OETAG_PROFTRNRQ}, {}},
         {OETAG_KEST_BRANDMSGSRQV1,
          OETAG_KEST_BRANDMSGSRQV2,
@@ -180,10 +179,12 @@ template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
 // ================================================================ message sets
 
 OEMessageSetBase::OEMessageSetBase(unsigned short version, bool request)
-    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr) {}
+    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr),
+      m_secList(nullptr) {}
 
 OEMessageSetBase::~OEMessageSetBase() {
     delete m_signOn;
+    delete m_secList;
 }
 
 unsigned short OEMessageSetBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
@@ -207,25 +208,34 @@ OEDataObj* OEMessageSetBase::GetChild(unsigned short index) const {
         --index;
     }
     if (index < m_trans.Entries()) return m_trans.Get(index);
-    return m_sync.Get(static_cast<unsigned short>(index - m_trans.Entries()));
+    index = static_cast<unsigned short>(index - m_trans.Entries());
+    if (index < m_sync.Entries()) return m_sync.Get(index);
+    return index == m_sync.Entries() ? m_secList : nullptr;
 }
 
 unsigned short OEMessageSetBase::GetNumberOfChildren() const {
-    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries());
+    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries() +
+                                       (m_secList ? 1 : 0));
 }
 
-OEParseStatus OEMessageSetBase::PushSignOn(const OETagDictionaryEntry* entry) {
+OEParseStatus OEMessageSetBase::PushSingle(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    if (m_signOn) {
+    bool secList = entry->m_id == OETAG_SECLIST;
+    OEDataObj*& slot = secList ? m_secList : m_signOn;
+    if (slot) {
         OELogParseWarning(OEPW_EXTRAAGG, "", "", entry->m_id, this);
-        delete m_signOn;
-        m_signOn = nullptr;
+        delete slot;
+        slot = nullptr;
     }
-    m_signOn = m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(GetMsgSetVersion()))
-                         : static_cast<OEDataObj*>(factory->NewSignOnRs(GetMsgSetVersion()));
-    if (!m_signOn) return OEPS_NORESOURCE;
-    return PushAndSetObject(m_signOn, entry->m_id);
+    unsigned short v = GetMsgSetVersion();
+    if (secList)
+        slot = factory->NewSecList(v);
+    else
+        slot = m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(v))
+                         : static_cast<OEDataObj*>(factory->NewSignOnRs(v));
+    if (!slot) return OEPS_NORESOURCE;
+    return PushAndSetObject(slot, entry->m_id);
 }
 
 OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
@@ -304,6 +314,14 @@ int OEMessageSetBase::Build(OEBuilder* builder) {
     if (!t) return OEBS_OK;
     for (const OETagRow& row : t->m_rows) {
         if (row.m_tag == SignOnTag()) continue;
+        if (row.m_tag == OETAG_SECLIST) {
+            int status = m_secList ? m_secList->BuildObject(builder, OETAG_NONE) : OEBS_OK;
+            if (status != OEBS_OK) {
+                builder->SetFailedObject(this);
+                return status;
+            }
+            continue;
+        }
         const OEDataObjList& list = IsSyncTag(row.m_tag) ? m_sync : m_trans;
         for (unsigned short i = 0; i < list.Entries(); ++i) {
             OEDataObj* child = list.Get(i);
@@ -384,7 +402,7 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
 OEParseStatus OEMessageSetRq::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
     OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRQ) return PushSignOn(entry);
+    if (tag == OETAG_SONRQ) return PushSingle(entry);
     const WrapperTables* t = TablesOf(GetType());
     bool listed = false;
     if (t)
@@ -502,12 +520,13 @@ OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
 OEParseStatus OEMessageSetRs::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
     OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRS) return PushSignOn(entry);
+    if (tag == OETAG_SONRS) return PushSingle(entry);
     const WrapperTables* t = TablesOf(GetType());
     bool listed = false;
     if (t)
         for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
     if (!listed) return OEPS_INVALID;
+    if (tag == OETAG_SECLIST) return PushSingle(entry);
     return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
 }
 
@@ -516,6 +535,15 @@ unsigned short OEMessageSetRs::SetSignOnRs(OESignOnRs* signOn) {
     if (!signOn) ClearTag(OETAG_SONRS);
     m_signOn = signOn;
     SetTag(OETAG_SONRS);
+    return 1;
+}
+
+unsigned short OEMessageSetRs::SetSecList(OESecList* list) {
+    if (!IsValidTag(OETAG_SECLIST)) return 0;
+    if (m_secList != list) delete m_secList;
+    if (!list) ClearTag(OETAG_SECLIST);
+    m_secList = list;
+    SetTag(OETAG_SECLIST);
     return 1;
 }
 
@@ -536,6 +564,14 @@ unsigned short OEMessageSetRs::DeepCopyFrom(const OEMessageSetRs* other) {
         delete m_signOn;
         m_signOn = nullptr;
         ClearTag(OETAG_SONRS);
+    }
+    if (other->m_secList) {
+        if (!m_secList) m_secList = factory->NewSecList(other->m_secList->GetMsgSetVersion());
+        if (!m_secList || !GetSecList()->DeepCopyFrom(other->GetSecList())) return 0;
+    } else if (m_secList) {
+        delete m_secList;
+        m_secList = nullptr;
+        ClearTag(OETAG_SECLIST);
     }
     return CopyFrom(other);
 }

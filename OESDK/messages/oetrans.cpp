@@ -8,6 +8,7 @@
 #include "messages/oechallenge.h"
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
+#include "messages/oeseclist.h"
 #include "messages/oesignon.h"
 
 #include <cstdlib>
@@ -141,6 +142,7 @@ const OEFieldRow kTransRqFields[] = {
     {OETAG_CCSTMTENDRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementEndRq)},
     {OETAG_CHALLENGERQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewChallengeRq)},
     {OETAG_PROFRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewProfileRq)},
+    {OETAG_SECLISTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewSecListRq)},
 };
 
 // ---- transaction response wrapper ----
@@ -158,6 +160,7 @@ const OEFieldRow kTransRsFields[] = {
     {OETAG_CCSTMTENDRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementEndRs)},
     {OETAG_CHALLENGERS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewChallengeRs)},
     {OETAG_PROFRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewProfileRs)},
+    {OETAG_SECLISTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewSecListRs)},
 };
 
 // ---- STATUS ----
