@@ -50,6 +50,11 @@ public:
     const OEString& GetMIMEBody() const { return m_mimeBody; }
 
     // Stores a copy made through the factory, not the caller's object.
+    // Writing a multipart file: each part is built on its own (with its own header block unless
+    // it has the omit-headers flag), gets "content-length" (and "content-type" for an OFX request
+    // or response file), and is written as its headers (MIME, then OFX) followed by that text.
+    // So a part without the flag carries its OFX header block twice; give parts the flag to
+    // write the block once, with "content-length" counting the part's body.
     unsigned short AppendSubfile(const OEFile* subfile);
     unsigned short SetSubfile(unsigned short index, const OEFile* subfile);
     OEFile* GetSubfile(unsigned short index) const { return m_subfiles.Get(index); }

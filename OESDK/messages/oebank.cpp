@@ -217,14 +217,14 @@ const OEAggregateDesc& OEIncTransaction::Describe() const {
 
 // ---------------------------------------------------------------- STMTRS / CCSTMTRS
 
-OEBankStatementRs::OEBankStatementRs(unsigned short version) : OEStatementOf(version) {
+OEBankStatementRs::OEBankStatementRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTRS);
 }
 const OEAggregateDesc& OEBankStatementRs::Describe() const {
     return kStmtRsDesc;
 }
 
-OECCStatementRs::OECCStatementRs(unsigned short version) : OEStatementOf(version) {
+OECCStatementRs::OECCStatementRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTRS);
 }
 const OEAggregateDesc& OECCStatementRs::Describe() const {
@@ -253,14 +253,14 @@ OEParseStatus OEGenericStatementRq::HandleTagStart(const OETagDictionaryEntry* e
     return PushAndSetObject(child, entry->m_id);
 }
 
-OEBankStatementRq::OEBankStatementRq(unsigned short version) : OEStatementOf(version) {
+OEBankStatementRq::OEBankStatementRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTRQ);
 }
 const OEAggregateDesc& OEBankStatementRq::Describe() const {
     return kStmtRqDesc;
 }
 
-OECCStatementRq::OECCStatementRq(unsigned short version) : OEStatementOf(version) {
+OECCStatementRq::OECCStatementRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTRQ);
 }
 const OEAggregateDesc& OECCStatementRq::Describe() const {

@@ -162,25 +162,25 @@ public:
     OEString360 m_mktgInfo;
 };
 
-// A statement request or response of one kind of account: GetAccountFrom and SetAccountFrom over
-// the child under Tag, of class Account.
-template <class Base, class Account, OETagID Tag> class OEStatementOf : public Base {
+// Typed access to the FROM account of a statement or statement-end aggregate: OEBankAccount for
+// BANKACCTFROM, OECCAccount for CCACCTFROM.
+template <class Base, class Account, OETagID Tag> class OEAccountFromOf : public Base {
 public:
-    using Base::Base;
+    explicit OEAccountFromOf(unsigned short version = 0) : Base(version) {}
     Account* GetAccountFrom() const { return static_cast<Account*>(this->GetChildObj(Tag)); }
-    unsigned short SetAccountFrom(Account* a) { return this->SetChildObj(Tag, a); }
+    unsigned short SetAccountFrom(Account* account) { return this->SetChildObj(Tag, account); }
 };
 
 // STMTRS.
 class OE_API OEBankStatementRs
-    : public OEStatementOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM> {
+    : public OEAccountFromOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEBankStatementRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
 };
 
 // CCSTMTRS: the same with CCACCTFROM.
-class OE_API OECCStatementRs : public OEStatementOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM> {
+class OE_API OECCStatementRs : public OEAccountFromOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
@@ -203,14 +203,14 @@ public:
 
 // STMTRQ.
 class OE_API OEBankStatementRq
-    : public OEStatementOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM> {
+    : public OEAccountFromOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEBankStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
 };
 
 // CCSTMTRQ.
-class OE_API OECCStatementRq : public OEStatementOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM> {
+class OE_API OECCStatementRq : public OEAccountFromOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;

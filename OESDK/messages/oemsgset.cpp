@@ -55,9 +55,8 @@ const std::vector<Family>& Families() {
          OETAG_EMAILMSGSRQV2,
          {OETAG_MAILTRNRQ, OETAG_MAILSYNCRQ, OETAG_GETMIMETRNRQ},
          {}},
-        // The security list (SECLIST) of the response side is held by a class that is not part of
-        // the library yet; until it is, the parser skips it as not valid here.
-        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {}},
+        // The response side's SECLIST follows its wrappers.
+        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {OETAG_SECLIST}},
         {OETAG_PROFMSGSRQV1, OETAG_PROFMSGSRQV2, {OETAG_PROFTRNRQ}, {}},
         {OETAG_KEST_BRANDMSGSRQV1,
          OETAG_KEST_BRANDMSGSRQV2,
@@ -72,6 +71,16 @@ const std::vector<Family>& Families() {
         {OETAG_K_EFILEMSGSRQV1, OETAG_NONE, {OETAG_K_EFILESYNCRQ}, {OETAG_K_EFILETRNRS}},
     };
     return families;
+}
+
+// A new transaction wrapper for a tag: the multiple interbank wrappers have classes of their own,
+// every other tag gets the plain wrapper.
+OEDataObj* NewWrapper(OEDataObjFactory* factory, bool request, OETagID tag, unsigned short version) {
+    if (request)
+        return tag == OETAG_MULTIINTERTRNRQ ? static_cast<OEDataObj*>(factory->NewMultiTransRq(version))
+                                            : static_cast<OEDataObj*>(factory->NewTransRq(version));
+    return tag == OETAG_MULTIINTERTRNRS ? static_cast<OEDataObj*>(factory->NewMultiTransRs(version))
+                                        : static_cast<OEDataObj*>(factory->NewTransRs(version));
 }
 
 // The valid rows of each wrapper, both sides, built once from the families.
@@ -170,10 +179,12 @@ template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
 // ================================================================ message sets
 
 OEMessageSetBase::OEMessageSetBase(unsigned short version, bool request)
-    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr) {}
+    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr),
+      m_secList(nullptr) {}
 
 OEMessageSetBase::~OEMessageSetBase() {
     delete m_signOn;
+    delete m_secList;
 }
 
 unsigned short OEMessageSetBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
@@ -197,36 +208,43 @@ OEDataObj* OEMessageSetBase::GetChild(unsigned short index) const {
         --index;
     }
     if (index < m_trans.Entries()) return m_trans.Get(index);
-    return m_sync.Get(static_cast<unsigned short>(index - m_trans.Entries()));
+    index = static_cast<unsigned short>(index - m_trans.Entries());
+    if (index < m_sync.Entries()) return m_sync.Get(index);
+    return index == m_sync.Entries() ? m_secList : nullptr;
 }
 
 unsigned short OEMessageSetBase::GetNumberOfChildren() const {
-    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries());
+    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries() +
+                                       (m_secList ? 1 : 0));
 }
 
 OEParseStatus OEMessageSetBase::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
     OETagID tag = entry->m_id;
-    if (tag == SignOnTag()) return PushSignOn(entry);
+    if (tag == SignOnTag()) return PushSingle(entry);
     const WrapperTables* t = TablesOf(GetType());
     bool listed = false;
     if (t)
         for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
     if (!listed) return OEPS_INVALID;
+    if (tag == OETAG_SECLIST) return PushSingle(entry); // listed on the response side only
     return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
 }
 
-OEParseStatus OEMessageSetBase::PushSignOn(const OETagDictionaryEntry* entry) {
+OEParseStatus OEMessageSetBase::PushSingle(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    if (m_signOn) {
+    bool secList = entry->m_id == OETAG_SECLIST;
+    OEDataObj*& slot = secList ? m_secList : m_signOn;
+    if (slot) {
         OELogParseWarning(OEPW_EXTRAAGG, "", "", entry->m_id, this);
-        delete m_signOn;
-        m_signOn = nullptr;
+        delete slot;
+        slot = nullptr;
     }
-    m_signOn = NewSignOn(factory, GetMsgSetVersion());
-    if (!m_signOn) return OEPS_NORESOURCE;
-    return PushAndSetObject(m_signOn, entry->m_id);
+    unsigned short v = GetMsgSetVersion();
+    slot = secList ? factory->NewSecList(v) : NewSignOn(factory, v);
+    if (!slot) return OEPS_NORESOURCE;
+    return PushAndSetObject(slot, entry->m_id);
 }
 
 OEDataObj* OEMessageSetBase::NewSignOn(OEDataObjFactory* factory, unsigned short version) const {
@@ -260,10 +278,7 @@ OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
 OEParseStatus OEMessageSetBase::PushTranObject(OETagID tag) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    // MULTIINTERTRNRQ / RS have a class of their own that is not part of the library yet; the
-    // plain wrapper stands in for it until then.
-    OEDataObj* trans = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(GetMsgSetVersion()))
-                                 : static_cast<OEDataObj*>(factory->NewTransRs(GetMsgSetVersion()));
+    OEDataObj* trans = NewWrapper(factory, m_request, tag, GetMsgSetVersion());
     if (trans) {
         trans->SetType(tag);
         if (m_request)
@@ -321,6 +336,14 @@ int OEMessageSetBase::Build(OEBuilder* builder) {
     if (!t) return OEBS_OK;
     for (const OETagRow& row : t->m_rows) {
         if (row.m_tag == SignOnTag()) continue;
+        if (row.m_tag == OETAG_SECLIST) {
+            int status = m_secList ? m_secList->BuildObject(builder, OETAG_NONE) : OEBS_OK;
+            if (status != OEBS_OK) {
+                builder->SetFailedObject(this);
+                return status;
+            }
+            continue;
+        }
         const OEDataObjList& list = IsSyncTag(row.m_tag) ? m_sync : m_trans;
         for (unsigned short i = 0; i < list.Entries(); ++i) {
             OEDataObj* child = list.Get(i);
@@ -373,6 +396,16 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
         // mark: kept as it is.
         ClearTag(OETAG_SONRS);
     }
+    if (other->m_secList) { // response side only
+        if (!m_secList) m_secList = factory->NewSecList(other->m_secList->GetMsgSetVersion());
+        if (!m_secList || !static_cast<OESecList*>(m_secList)->DeepCopyFrom(
+                              static_cast<const OESecList*>(other->m_secList)))
+            return 0;
+    } else if (m_secList) {
+        delete m_secList;
+        m_secList = nullptr;
+        ClearTag(OETAG_SECLIST);
+    }
     // Transactions, then synchronisations: trim, add fresh entries, deep-copy index by index.
     for (int pass = 0; pass < 2; ++pass) {
         OEDataObjList& to = pass == 0 ? m_trans : m_sync;
@@ -384,8 +417,7 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
             unsigned short v = src ? src->GetMsgSetVersion() : 0;
             OEDataObj* fresh;
             if (pass == 0)
-                fresh = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(v))
-                                  : static_cast<OEDataObj*>(factory->NewTransRs(v));
+                fresh = NewWrapper(factory, m_request, src ? src->GetType() : OETAG_NONE, v);
             else
                 fresh = m_request ? static_cast<OEDataObj*>(factory->NewSyncRq(v))
                                   : static_cast<OEDataObj*>(factory->NewSyncRs(v));
@@ -488,6 +520,17 @@ OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
     default:
         return OETAG_NONE;
     }
+}
+
+// ---------------------------------------------------------------- OEMessageSetRs
+
+unsigned short OEMessageSetRs::SetSecList(OESecList* list) {
+    if (!IsValidTag(OETAG_SECLIST)) return 0;
+    if (m_secList != list) delete m_secList;
+    if (!list) ClearTag(OETAG_SECLIST);
+    m_secList = list;
+    SetTag(OETAG_SECLIST);
+    return 1;
 }
 
 // ================================================================ roots

@@ -2,6 +2,7 @@
 // OEMessageSetRs) that stand for every ...MSGSRQVn / ...MSGSRSVn aggregate.
 #ifndef OESDK_MESSAGES_OEMSGSET_H
 #define OESDK_MESSAGES_OEMSGSET_H
+#include "messages/oeseclist.h"
 #include "messages/oesignon.h"
 #include "messages/oetrans.h"
 
@@ -9,7 +10,8 @@ typedef OEPtrArray<OETransRq> OETransRqList;
 typedef OEPtrArray<OETransRs> OETransRsList;
 
 // The common part of the two message-set containers: a sign-on object, a list of transaction
-// wrappers and a list of synchronisation aggregates, routed by tag. `Rq` selects the request side.
+// wrappers and a list of synchronisation aggregates, routed by tag, and on the response side the
+// security list. `Rq` selects the request side.
 class OE_API OEMessageSetBase : public OEDataObj {
 public:
     OEMessageSetBase(unsigned short version, bool request);
@@ -24,7 +26,8 @@ public:
     unsigned short GetNumberOfChildren() const override;
     int Build(OEBuilder* builder) override;
     unsigned short AllRequiredPresent() override;
-    // The sign-on of the set's side, or a transaction wrapper or synchronisation its table lists.
+    // The sign-on of the set's side, or a transaction wrapper, synchronisation or SECLIST its table
+    // lists.
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
 
     unsigned short GetNumTrans() const { return m_trans.Entries(); }
@@ -35,13 +38,15 @@ public:
     unsigned short SetFactory(OEDataObjFactory* factory);
 
 protected:
-    OEParseStatus PushSignOn(const OETagDictionaryEntry* entry);
+    // The children held one at a time (sign-on, security list): a second one logs OEPW_EXTRAAGG
+    // and replaces the first.
+    OEParseStatus PushSingle(const OETagDictionaryEntry* entry);
     OEParseStatus PushSyncObject(OETagID tag);
     OEParseStatus PushTranObject(OETagID tag);
     unsigned short StoreTrans(unsigned short index, OEDataObj* trans, bool append);
     unsigned short StoreSync(unsigned short index, OEDataObj* sync, bool append);
     OEDataObj* Disconnect(OEDataObjList& list, unsigned short index);
-    // Copies sign-on, transactions and synchronisations of a set of the same side.
+    // Copies sign-on, security list, transactions and synchronisations of a set of the same side.
     unsigned short CopyFrom(const OEMessageSetBase* other);
     OEDataObj* NewSignOn(OEDataObjFactory* factory, unsigned short version) const;
     // Deletes the held sign-on, clears its mark only when `signOn` is null, stores it, marks it.
@@ -52,6 +57,7 @@ protected:
     OEDataObjList m_trans;
     OEDataObjList m_sync;
     OEDataObj* m_signOn;
+    OEDataObj* m_secList; // response side only
 };
 
 // The typed list accessors of one side: TransT is its transaction wrapper class, SyncT its
@@ -101,6 +107,11 @@ public:
 
     OESignOnRs* GetSignOnRs() const { return static_cast<OESignOnRs*>(m_signOn); }
     unsigned short SetSignOnRs(OESignOnRs* signOn) { return StoreSignOn(signOn); }
+    // The SECLIST of a security-list set, written after its wrappers.
+    OESecList* GetSecList() const { return static_cast<OESecList*>(m_secList); }
+    // The sign-on setter's rule: the held list is deleted, the mark cleared only for null, then
+    // set in every case. A set whose tag takes no SECLIST refuses (0; the caller keeps the list).
+    unsigned short SetSecList(OESecList* list);
     unsigned short DeepCopyFrom(const OEMessageSetRs* other) { return CopyFrom(other); }
 };
 

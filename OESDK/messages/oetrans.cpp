@@ -5,6 +5,10 @@
 #include "foundation/oethread.h"
 #include "messages/oeaccount.h"
 #include "messages/oebank.h"
+#include "messages/oechallenge.h"
+#include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
+#include "messages/oeseclist.h"
 #include "messages/oesignon.h"
 
 #include <cstdlib>
@@ -144,6 +148,11 @@ const OEFieldRow kTransRqFields[] = {
     {OETAG_STMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewBankStatementRq)},
     {OETAG_CCSTMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementRq)},
     {OETAG_PINCHRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewPinChangeRq)},
+    {OETAG_STMTENDRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewStatementEndRq)},
+    {OETAG_CCSTMTENDRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementEndRq)},
+    {OETAG_CHALLENGERQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewChallengeRq)},
+    {OETAG_PROFRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewProfileRq)},
+    {OETAG_SECLISTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewSecListRq)},
 };
 
 // ---- transaction response wrapper ----
@@ -157,6 +166,11 @@ const OEFieldRow kTransRsFields[] = {
     {OETAG_STMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewBankStatementRs)},
     {OETAG_CCSTMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementRs)},
     {OETAG_PINCHRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewPinChangeRs)},
+    {OETAG_STMTENDRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewStatementEndRs)},
+    {OETAG_CCSTMTENDRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementEndRs)},
+    {OETAG_CHALLENGERS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewChallengeRs)},
+    {OETAG_PROFRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewProfileRs)},
+    {OETAG_SECLISTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewSecListRs)},
 };
 
 // ---- STATUS ----
@@ -289,6 +303,72 @@ const OEAggregateDesc& TransRsDesc() {
     static const OEAggregateDesc desc = WrapperDesc(valid, kTransRsRequired, kTransRsFields);
     return desc;
 }
+
+// ---- MULTIINTERTRNRQ / MULTIINTERTRNRS ----
+// A multiple wrapper has the plain wrapper's first rows (its elements, and STATUS and WARNING on
+// the response side), then a list of inner aggregates made by the plain wrapper's creator for
+// that tag. So INTERRQ / INTERRS become available here the moment the plain wrapper gets a row
+// for them.
+const unsigned short kWrapperOwnRows = 4;
+static_assert(sizeof(kTransRqFields) / sizeof(kTransRqFields[0]) >= kWrapperOwnRows, "own rows");
+static_assert(sizeof(kTransRsFields) / sizeof(kTransRsFields[0]) >= kWrapperOwnRows, "own rows");
+
+template <size_t N> const OEFieldRow* InnerRowOf(const OEFieldRow (&rows)[N], OETagID tag) {
+    for (const OEFieldRow& r : rows)
+        if (r.m_tag == tag && r.m_kind == OEFK_CHILD) return &r;
+    return nullptr;
+}
+
+OEDataObj* MakeInterRq(OEDataObjFactory* factory, unsigned short version) {
+    const OEFieldRow* row = InnerRowOf(kTransRqFields, OETAG_INTERRQ);
+    return row ? row->m_make(factory, version) : nullptr;
+}
+OEDataObj* MakeInterRs(OEDataObjFactory* factory, unsigned short version) {
+    const OEFieldRow* row = InnerRowOf(kTransRsFields, OETAG_INTERRS);
+    return row ? row->m_make(factory, version) : nullptr;
+}
+
+// The rows of a multiple wrapper: `own` (the plain wrapper's first rows), then `list`.
+struct MultiTables {
+    std::vector<OEFieldRow> m_fields;
+    std::vector<OETagRow> m_valid;
+    MultiTables(const OEFieldRow* own, const OEFieldRow& list) : m_fields(own, own + kWrapperOwnRows) {
+        m_fields.push_back(list);
+        for (const OEFieldRow& r : m_fields) m_valid.push_back(OETagRow{r.m_tag, OEVM_ALL, 0});
+    }
+};
+
+const OETagRow kMultiRqRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}, {OETAG_INTERRQ, OEVM_ALL, 0}};
+
+const OEAggregateDesc& MultiRqDesc() {
+    static const MultiTables t(
+        kTransRqFields,
+        OEFieldRow{OETAG_INTERRQ, OEFK_LIST, OE_MEMBER(OEMultiTransRq, m_inter), nullptr, MakeInterRq});
+    static const OEAggregateDesc desc{OETAG_MULTIINTERTRNRQ,
+                                      t.m_valid.data(),
+                                      static_cast<unsigned short>(t.m_valid.size()),
+                                      kMultiRqRequired,
+                                      2,
+                                      t.m_fields.data(),
+                                      static_cast<unsigned short>(t.m_fields.size())};
+    return desc;
+}
+
+const OEAggregateDesc& MultiRsDesc() {
+    static const MultiTables t(
+        kTransRsFields,
+        OEFieldRow{OETAG_INTERRS, OEFK_LIST, OE_MEMBER(OEMultiTransRs, m_inter), nullptr, MakeInterRs});
+    static const OEAggregateDesc desc{
+        OETAG_MULTIINTERTRNRS,
+        t.m_valid.data(),
+        static_cast<unsigned short>(t.m_valid.size()),
+        kTransRsRequired,
+        static_cast<unsigned short>(sizeof(kTransRsRequired) / sizeof(kTransRsRequired[0])),
+        t.m_fields.data(),
+        static_cast<unsigned short>(t.m_fields.size())};
+    return desc;
+}
+
 const OEAggregateDesc kStatusDesc = OE_DESC(OETAG_STATUS, kStatusValid, kStatusRequired, kStatusFields);
 const OEAggregateDesc kWarningDesc = OE_DESC(OETAG_WARNING, kWarningValid, kWarningValid, kWarningFields);
 const OEAggregateDesc kSyncRqDesc = OE_DESC(OETAG_NONE, kSyncRqValid, kSyncRqRequired, kSyncRqFields);
@@ -589,6 +669,41 @@ unsigned short OESyncBase::CopyExtraFrom(const OEAggregate* other) {
         if (!copy->DeepCopyFrom(from)) return 0;
     }
     return 1;
+}
+
+// ---------------------------------------------------------------- OEMultiTransRq / Rs
+
+OEMultiTransRq::OEMultiTransRq(unsigned short version) : OETransRq(version), m_inter(1, 5) {
+    SetType(OETAG_MULTIINTERTRNRQ);
+}
+const OEAggregateDesc& OEMultiTransRq::Describe() const {
+    return MultiRqDesc();
+}
+
+OEParseStatus OEMultiTransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry || entry->m_id != OETAG_INTERRQ || !InnerRowOf(kTransRqFields, OETAG_INTERRQ))
+        return OEPS_INVALID;
+    return OEAggregate::HandleTagStart(entry);
+}
+
+unsigned short OEMultiTransRq::AllRequiredPresent() {
+    return OEAggregate::AllRequiredPresent() && m_inter.Entries() > 0;
+}
+
+OEMultiTransRs::OEMultiTransRs(unsigned short version) : OETransRs(version), m_inter(1, 5) {
+    SetType(OETAG_MULTIINTERTRNRS);
+}
+const OEAggregateDesc& OEMultiTransRs::Describe() const {
+    return MultiRsDesc();
+}
+
+OEParseStatus OEMultiTransRs::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (entry && entry->m_id == OETAG_INTERRS) {
+        if (!InnerRowOf(kTransRsFields, OETAG_INTERRS)) return OEPS_INVALID;
+        return OEAggregate::HandleTagStart(entry);
+    }
+    // STATUS and WARNING as in the plain wrapper; no other inner response has a row here.
+    return OETransRs::HandleTagStart(entry);
 }
 
 // ---------------------------------------------------------------- OESyncRq

@@ -138,6 +138,41 @@ public:
     OEOwnedChild m_status, m_warning;
 };
 
+// MULTIINTERTRNRQ: a transaction request wrapper that carries one or more INTERRQ, in order. The
+// requests live in a list of their own; the single inner slot of the plain wrapper stays empty.
+class OE_API OEMultiTransRq : public OETransRq {
+public:
+    explicit OEMultiTransRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    unsigned short AppendInterRq(OETransBase* rq) { return AppendToList(OETAG_INTERRQ, rq); }
+    OETransBase* GetInterRq(unsigned short index) const {
+        return static_cast<OETransBase*>(m_inter.Get(index));
+    }
+    unsigned short GetNumInterRq() const { return m_inter.Entries(); }
+    // An INTERRQ is made by the creator the plain wrapper has for it: 4 while there is none.
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    // TRNUID and at least one INTERRQ.
+    unsigned short AllRequiredPresent() override;
+
+    OEDataObjList m_inter;
+};
+
+// MULTIINTERTRNRS: the response wrapper with zero or more INTERRS (none when STATUS reports an
+// error).
+class OE_API OEMultiTransRs : public OETransRs {
+public:
+    explicit OEMultiTransRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    unsigned short AppendInterRs(OETransBase* rs) { return AppendToList(OETAG_INTERRS, rs); }
+    OETransBase* GetInterRs(unsigned short index) const {
+        return static_cast<OETransBase*>(m_inter.Get(index));
+    }
+    unsigned short GetNumInterRs() const { return m_inter.Entries(); }
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+
+    OEDataObjList m_inter;
+};
+
 // The common part of the synchronisation request and response: TOKEN / TOKEN2, the account, the
 // transaction wrappers listed after the elements, and the enclosing set's tag. `request` selects
 // the side.
