@@ -181,7 +181,7 @@ unsigned short OEBankStatementTx::SetCurrency(OEDataObj* currency) {
 
 // ---------------------------------------------------------------- BANKTRANLIST
 
-OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEDateRange(version), m_tx(16, 64) {
+OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEDateRangeOf(version), m_tx(16, 64) {
     SetType(OETAG_BANKTRANLIST);
 }
 const OEAggregateDesc& OEBankTransactionList::Describe() const {
@@ -208,7 +208,7 @@ void OEBankTransactionList::DeleteAllStatementTx() {
 
 // ---------------------------------------------------------------- INCTRAN
 
-OEIncTransaction::OEIncTransaction(unsigned short version) : OEDateRange(version) {
+OEIncTransaction::OEIncTransaction(unsigned short version) : OEDateRangeOf(version) {
     SetType(OETAG_INCTRAN);
 }
 const OEAggregateDesc& OEIncTransaction::Describe() const {

@@ -91,22 +91,23 @@ public:
     OEOwnedChild m_accountTo;
 };
 
-// The DTSTART / DTEND pair of a transaction list and of INCTRAN.
-class OE_API OEDateRange : public OEAggregate {
+// The DTSTART / DTEND pair of a transaction list, of INCTRAN and of the statement-end requests,
+// over the class Base.
+template <class Base> class OEDateRangeOf : public Base {
 public:
-    explicit OEDateRange(unsigned short version = 0) : OEAggregate(version) {}
-    const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
+    explicit OEDateRangeOf(unsigned short version = 0) : Base(version) {}
+    const OEDateTime* GetDateStart() const { return this->GetDateTime(OETAG_DTSTART); }
+    unsigned short SetDateStart(const OEString& v) { return this->SetFromText(OETAG_DTSTART, v); }
+    unsigned short SetDateStart(const OEDateTime& v) { return this->SetDateTime(OETAG_DTSTART, v); }
+    const OEDateTime* GetDateEnd() const { return this->GetDateTime(OETAG_DTEND); }
+    unsigned short SetDateEnd(const OEString& v) { return this->SetFromText(OETAG_DTEND, v); }
+    unsigned short SetDateEnd(const OEDateTime& v) { return this->SetDateTime(OETAG_DTEND, v); }
 
     OEDateTime m_dtStart, m_dtEnd;
 };
 
 // BANKTRANLIST: DTSTART, DTEND and the transactions in order.
-class OE_API OEBankTransactionList : public OEDateRange {
+class OE_API OEBankTransactionList : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEBankTransactionList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
@@ -125,7 +126,7 @@ public:
 };
 
 // INCTRAN: DTSTART, DTEND, INCLUDE (required).
-class OE_API OEIncTransaction : public OEDateRange {
+class OE_API OEIncTransaction : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEIncTransaction(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;

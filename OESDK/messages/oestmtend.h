@@ -93,17 +93,9 @@ public:
 // The statement-end requests: the account and an optional date range. They share the account
 // handling of the statement requests (a repeated account logs OEPW_EXTRAAGG and replaces the old
 // one); they hold no INCTRAN.
-class OE_API OEStatementEndRqBase : public OEGenericStatementRq {
+class OE_API OEStatementEndRqBase : public OEDateRangeOf<OEGenericStatementRq> {
 public:
-    explicit OEStatementEndRqBase(unsigned short version = 0) : OEGenericStatementRq(version) {}
-    const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
-
-    OEDateTime m_dtStart, m_dtEnd;
+    explicit OEStatementEndRqBase(unsigned short version = 0) : OEDateRangeOf(version) {}
 };
 
 // STMTENDRQ.
