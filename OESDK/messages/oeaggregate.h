@@ -17,6 +17,7 @@
 #include "foundation/oestring.h"
 #include "foundation/oeprecision.h"
 #include "foundation/oedatetime.h"
+#include "foundation/oedataconv.h"
 #include "tags/oedataobj.h"
 #include "tags/oedatafactory.h"
 
@@ -37,12 +38,6 @@ enum OEFieldKind : unsigned char {
     OEFK_CHILD,    // one owned child aggregate (OEOwnedChild); rows may share one slot
     OEFK_LIST,     // an owned, ordered list of child aggregates (OEPtrArray<OEDataObj>)
     OEFK_TEXTLIST  // a repeated element: an OEDynamicArrayString, one element per entry
-};
-
-// A keyword table of an enumeration: keyword i is value i.
-struct OEKeywordTable {
-    const char* const* m_words;
-    unsigned short m_count;
 };
 
 // One field row. `m_member` hands out the address of the value inside a given object; a captureless

@@ -6,10 +6,6 @@
 
 namespace {
 
-const char* const kTxType[] = {"CREDIT", "DEBIT",     "INT",         "DIV",       "FEE",   "SRVCHG",
-                               "DEP",    "ATM",       "POS",         "XFER",      "CHECK", "PAYMENT",
-                               "CASH",   "DIRECTDEP", "DIRECTDEBIT", "REPEATPMT", "OTHER"};
-const char* const kCorrectAction[] = {"REPLACE", "DELETE"};
 
 // ---- STMTTRN ----
 const OETagRow kTxValid[] = {
@@ -140,8 +136,6 @@ const OEAggregateDesc kCCStmtRqDesc =
 
 } // namespace
 
-const OEKeywordTable OEKW_BANKTXTYPE = {kTxType, 17};
-const OEKeywordTable OEKW_CORRECTACTION = {kCorrectAction, 2};
 
 // ---------------------------------------------------------------- STMTTRN
 

@@ -5,9 +5,6 @@
 #include "messages/oeaccount.h"
 #include "messages/oetrans.h"
 
-extern OE_API const OEKeywordTable OEKW_BANKTXTYPE;    // TRNTYPE: "CREDIT" ... "OTHER" (17)
-extern OE_API const OEKeywordTable OEKW_CORRECTACTION; // "REPLACE", "DELETE"
-
 // STMTTRN: one statement transaction.
 class OE_API OEBankStatementTx : public OEAggregate {
 public:

@@ -2,11 +2,7 @@
 
 namespace {
 
-const char* const kOFXSec[] = {"NONE", "TYPE1"};
-const char* const kSyncMode[] = {"FULL", "LITE"};
-const char* const kCharType[] = {"ALPHAONLY", "NUMERICONLY", "ALPHAORNUMERIC", "ALPHAANDNUMERIC"};
 const char* const kPwType[] = {"FIXED", "ONETIME", "HWTOKEN"};
-const char* const kClientRouting[] = {"NONE", "SERVICE", "MSGSET"};
 
 const OETagRow kCoreValid[] = {{OETAG_VER, OEVM_ALL, 0},
                                {OETAG_URL, OEVM_V1, 0},
@@ -235,11 +231,7 @@ const OEAggregateDesc kProfRsDesc = OE_DESC(OETAG_PROFRS, kProfRsValid, kProfRsR
 
 } // namespace
 
-const OEKeywordTable OEKW_OFXSECURITY = {kOFXSec, 2};
-const OEKeywordTable OEKW_SYNCMODE = {kSyncMode, 2};
-const OEKeywordTable OEKW_CHARTYPE = {kCharType, 4};
 const OEKeywordTable OEKW_PWTYPE = {kPwType, 3};
-const OEKeywordTable OEKW_CLIENTROUTING = {kClientRouting, 3};
 
 OEMessageSetCore::OEMessageSetCore(unsigned short version) : OEAggregate(version) {
     SetType(OETAG_MSGSETCORE);

@@ -5,11 +5,7 @@
 #define OESDK_MESSAGES_OEPROFILE_H
 #include "messages/oetrans.h"
 
-extern OE_API const OEKeywordTable OEKW_OFXSECURITY;   // "NONE", "TYPE1"
-extern OE_API const OEKeywordTable OEKW_SYNCMODE;      // "FULL", "LITE"
-extern OE_API const OEKeywordTable OEKW_CHARTYPE;      // "ALPHAONLY", "NUMERICONLY", "ALPHAORNUMERIC", ...
-extern OE_API const OEKeywordTable OEKW_PWTYPE;        // "FIXED", "ONETIME", "HWTOKEN"
-extern OE_API const OEKeywordTable OEKW_CLIENTROUTING; // "NONE", "SERVICE", "MSGSET"
+extern OE_API const OEKeywordTable OEKW_PWTYPE; // "FIXED", "ONETIME", "HWTOKEN"
 
 // MSGSETCORE.
 class OE_API OEMessageSetCore : public OEAggregate {

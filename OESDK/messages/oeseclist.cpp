@@ -2,30 +2,14 @@
 
 namespace {
 
-// Keyword tables in the order of their enumerations (keyword i is value i).
-const char* const kAssetClass[] = {"DOMESTICBOND", "INTLBOND",  "LARGESTOCK", "SMALLSTOCK",
-                                   "INTLSTOCK",    "MONEYMRKT", "OTHER"};
-const char* const kDebtType[] = {"COUPON", "ZERO"};
-const char* const kDebtClass[] = {"TREASURY", "MUNICIPAL", "CORPORATE", "OTHER"};
-// The last two are other spellings of SEMIANNUAL and ANNUAL, kept so that a value is written back
-// as it was read; GetCouponFreq folds them.
+// Two elements take their own keyword lists (the rest use the conversions' tables). The last two
+// words of COUPONFREQ are other spellings of SEMIANNUAL and ANNUAL, kept so that a value is written
+// back as it was read; GetCouponFreq folds them.
 const char* const kCouponFreq[] = {"MONTHLY", "QUARTERLY",    "SEMIANNUAL", "ANNUAL",
                                    "OTHER",   "SEMIANNUALLY", "ANUALLY"};
-const char* const kCallType[] = {"CALL", "PUT", "PREFUND", "MATURITY"};
-const char* const kMFType[] = {"OPENEND", "CLOSEEND", "OTHER"};
 const char* const kOptType[] = {"PUT", "CALL"}; // OEOT_OTHER has no keyword in OPTINFO
-const char* const kStockType[] = {"COMMON", "PREFERRED", "CONVERTIBLE", "OTHER"};
-
-#define OE_KEYWORDS(words)                                                                                   \
-    { words, static_cast<unsigned short>(sizeof(words) / sizeof(words[0])) }
-const OEKeywordTable kAssetClassTable = OE_KEYWORDS(kAssetClass);
-const OEKeywordTable kDebtTypeTable = OE_KEYWORDS(kDebtType);
-const OEKeywordTable kDebtClassTable = OE_KEYWORDS(kDebtClass);
-const OEKeywordTable kCouponFreqTable = OE_KEYWORDS(kCouponFreq);
-const OEKeywordTable kCallTypeTable = OE_KEYWORDS(kCallType);
-const OEKeywordTable kMFTypeTable = OE_KEYWORDS(kMFType);
-const OEKeywordTable kOptTypeTable = OE_KEYWORDS(kOptType);
-const OEKeywordTable kStockTypeTable = OE_KEYWORDS(kStockType);
+const OEKeywordTable kCouponFreqTable = {kCouponFreq, 7};
+const OEKeywordTable kOptTypeTable = {kOptType, 2};
 
 // SECLISTRS has no rows at all.
 const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
@@ -34,7 +18,7 @@ const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
 #define OE_SECINFO_ROW(C)                                                                                    \
     { OETAG_SECINFO, OEFK_CHILD, OE_MEMBER(C, m_secInfo), nullptr, OE_MAKE(NewSecInfo) }
 #define OE_ASSETCLASS_ROWS(C)                                                                                \
-    {OETAG_ASSETCLASS, OEFK_ENUM, OE_MEMBER(C, m_assetClass), &kAssetClassTable, nullptr}, {                 \
+    {OETAG_ASSETCLASS, OEFK_ENUM, OE_MEMBER(C, m_assetClass), &OEKW_ASSETCLASS, nullptr}, {                  \
         OETAG_FIASSETCLASS, OEFK_TEXT, OE_MEMBER(C, m_fiAssetClass), nullptr, nullptr                        \
     }
 
@@ -82,15 +66,15 @@ const OETagRow kDebtRequired[] = {
 const OEFieldRow kDebtFields[] = {
     OE_SECINFO_ROW(OEDebtInfo),
     {OETAG_PARVALUE, OEFK_AMOUNT, OE_MEMBER(OEDebtInfo, m_parValue), nullptr, nullptr},
-    {OETAG_DEBTTYPE, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_debtType), &kDebtTypeTable, nullptr},
-    {OETAG_DEBTCLASS, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_debtClass), &kDebtClassTable, nullptr},
+    {OETAG_DEBTTYPE, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_debtType), &OEKW_DEBTTYPE, nullptr},
+    {OETAG_DEBTCLASS, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_debtClass), &OEKW_DEBTCLASS, nullptr},
     {OETAG_COUPONRT, OEFK_AMOUNT, OE_MEMBER(OEDebtInfo, m_couponRate), nullptr, nullptr},
     {OETAG_DTCOUPON, OEFK_DATETIME, OE_MEMBER(OEDebtInfo, m_dtCoupon), nullptr, nullptr},
     {OETAG_COUPONFREQ, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_couponFreq), &kCouponFreqTable, nullptr},
     {OETAG_CALLPRICE, OEFK_AMOUNT, OE_MEMBER(OEDebtInfo, m_callPrice), nullptr, nullptr},
     {OETAG_YIELDTOCALL, OEFK_AMOUNT, OE_MEMBER(OEDebtInfo, m_yieldToCall), nullptr, nullptr},
     {OETAG_DTCALL, OEFK_DATETIME, OE_MEMBER(OEDebtInfo, m_dtCall), nullptr, nullptr},
-    {OETAG_CALLTYPE, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_callType), &kCallTypeTable, nullptr},
+    {OETAG_CALLTYPE, OEFK_ENUM, OE_MEMBER(OEDebtInfo, m_callType), &OEKW_CALLTYPE, nullptr},
     {OETAG_YIELDTOMAT, OEFK_AMOUNT, OE_MEMBER(OEDebtInfo, m_yieldToMat), nullptr, nullptr},
     {OETAG_DTMAT, OEFK_DATETIME, OE_MEMBER(OEDebtInfo, m_dtMat), nullptr, nullptr},
     OE_ASSETCLASS_ROWS(OEDebtInfo),
@@ -99,7 +83,7 @@ const OEFieldRow kDebtFields[] = {
 // ---- PORTION, FIPORTION, MFASSETCLASS, FIMFASSETCLASS ----
 const OETagRow kPortionValid[] = {{OETAG_ASSETCLASS, OEVM_ALL, 0}, {OETAG_PERCENT, OEVM_ALL, 0}};
 const OEFieldRow kPortionFields[] = {
-    {OETAG_ASSETCLASS, OEFK_ENUM, OE_MEMBER(OEPortion, m_assetClass), &kAssetClassTable, nullptr},
+    {OETAG_ASSETCLASS, OEFK_ENUM, OE_MEMBER(OEPortion, m_assetClass), &OEKW_ASSETCLASS, nullptr},
     {OETAG_PERCENT, OEFK_AMOUNT, OE_MEMBER(OEPortion, m_percent), nullptr, nullptr},
 };
 const OETagRow kFIPortionValid[] = {{OETAG_FIASSETCLASS, OEVM_ALL, 0}, {OETAG_PERCENT, OEVM_ALL, 0}};
@@ -121,7 +105,7 @@ const OETagRow kMFValid[] = {{OETAG_SECINFO, OEVM_ALL, 0},      {OETAG_MFTYPE, O
 const OETagRow kSecInfoOnly[] = {{OETAG_SECINFO, OEVM_ALL, 0}};
 const OEFieldRow kMFFields[] = {
     OE_SECINFO_ROW(OEMFInfo),
-    {OETAG_MFTYPE, OEFK_ENUM, OE_MEMBER(OEMFInfo, m_mfType), &kMFTypeTable, nullptr},
+    {OETAG_MFTYPE, OEFK_ENUM, OE_MEMBER(OEMFInfo, m_mfType), &OEKW_MFTYPE, nullptr},
     OE_YIELD_ROWS(OEMFInfo),
     {OETAG_MFASSETCLASS, OEFK_CHILD, OE_MEMBER(OEMFInfo, m_mfAssetClass), nullptr, OE_MAKE(NewMFAssetClass)},
     {OETAG_FIMFASSETCLASS, OEFK_CHILD, OE_MEMBER(OEMFInfo, m_fiMfAssetClass), nullptr,
@@ -166,7 +150,7 @@ const OETagRow kStockValid[] = {{OETAG_SECINFO, OEVM_ALL, 0},     {OETAG_STOCKTY
                                 {OETAG_FIASSETCLASS, OEVM_ALL, 0}};
 const OEFieldRow kStockFields[] = {
     OE_SECINFO_ROW(OEStockInfo),
-    {OETAG_STOCKTYPE, OEFK_ENUM, OE_MEMBER(OEStockInfo, m_stockType), &kStockTypeTable, nullptr},
+    {OETAG_STOCKTYPE, OEFK_ENUM, OE_MEMBER(OEStockInfo, m_stockType), &OEKW_STOCKTYPE, nullptr},
     OE_YIELD_ROWS(OEStockInfo),
     {OETAG_TYPEDESC, OEFK_TEXT, OE_MEMBER(OEStockInfo, m_typeDesc), nullptr, nullptr},
     OE_ASSETCLASS_ROWS(OEStockInfo),

@@ -174,8 +174,6 @@ const OEFieldRow kTransRsFields[] = {
 };
 
 // ---- STATUS ----
-const char* const kSeverity[] = {"INFO", "WARN", "ERROR"};
-const OEKeywordTable kSeverityTable = {kSeverity, 3};
 const OETagRow kStatusValid[] = {{OETAG_CODE, OEVM_ALL, 0},
                                  {OETAG_SEVERITY, OEVM_ALL, 0},
                                  {OETAG_MESSAGE, OEVM_V1, 0},
@@ -183,7 +181,7 @@ const OETagRow kStatusValid[] = {{OETAG_CODE, OEVM_ALL, 0},
 const OETagRow kStatusRequired[] = {{OETAG_CODE, OEVM_ALL, 0}, {OETAG_SEVERITY, OEVM_ALL, 0}};
 const OEFieldRow kStatusFields[] = {
     {OETAG_CODE, OEFK_SLONG, OE_MEMBER(OEStatus, m_code), nullptr, nullptr},
-    {OETAG_SEVERITY, OEFK_ENUM, OE_MEMBER(OEStatus, m_severity), &kSeverityTable, nullptr},
+    {OETAG_SEVERITY, OEFK_ENUM, OE_MEMBER(OEStatus, m_severity), &OEKW_SEVERITY, nullptr},
     {OETAG_MESSAGE, OEFK_TEXT, OE_MEMBER(OEStatus, m_message), nullptr, nullptr},
     {OETAG_MESSAGE2, OEFK_TEXT, OE_MEMBER(OEStatus, m_message2), nullptr, nullptr},
 };
@@ -439,8 +437,8 @@ unsigned short OEStatus::SetCode(long code) {
 }
 
 unsigned short OEStatus::SetSeverity(const OEString& text) {
-    for (unsigned short i = 0; i < 3; ++i) {
-        if (text.strcmpi(kSeverity[i]) == 0) return SetSeverity(static_cast<OEStatusSeverity>(i));
+    for (unsigned short i = 0; i < OEKW_SEVERITY.m_count; ++i) {
+        if (text.strcmpi(OEKW_SEVERITY.m_words[i]) == 0) return SetSeverity(static_cast<OEStatusSeverity>(i));
     }
     // The conversion reports the word first (no tag), then the setter against SEVERITY.
     OELogParseWarning(OEPW_BADFORMAT, text.c_str(), "", OETAG_NONE, this);
