@@ -559,9 +559,15 @@ unsigned short OERootBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
     return 1;
 }
 
+// Any wrapper of the valid list is accepted, V1 or V2, whatever version the root was made with:
+// a set's version comes from its own tag, so a V1 sign-on set and a V2 bank set may share a body.
 OEParseStatus OERootBase::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry || !IsValidTag(entry->m_id)) return OEPS_INVALID;
-    return PushMsgObject(entry->m_id);
+    if (!entry) return OEPS_INVALID;
+    OEArrayOfTags valid;
+    GetArrayOfValidTags(valid);
+    for (unsigned short i = 0; i < valid.m_count; ++i)
+        if (valid.m_rows[i].m_tag == entry->m_id) return PushMsgObject(entry->m_id);
+    return OEPS_INVALID;
 }
 
 OEParseStatus OERootBase::PushMsgObject(OETagID tag) {
