@@ -56,6 +56,9 @@
 #include "messages/oemsgset.h"
 #include "messages/oebank.h"
 #include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
+#include "messages/oechallenge.h"
+#include "messages/oeseclist.h"
 
 // Transport
 #include "net/oenetacc.h"

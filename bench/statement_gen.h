@@ -30,10 +30,7 @@ public:
         Open(out, "OFX");
         Open(out, "SIGNONMSGSRSV1");
         Open(out, "SONRS");
-        Open(out, "STATUS");
-        Element(out, "CODE", "0");
-        Element(out, "SEVERITY", "INFO");
-        Close(out, "STATUS");
+        Status(out);
         Element(out, "DTSERVER", "20240105120000.000[-5:EST]");
         Element(out, "LANGUAGE", "ENG");
         Close(out, "SONRS");
@@ -41,10 +38,7 @@ public:
         Open(out, "BANKMSGSRSV1");
         Open(out, "STMTTRNRS");
         Element(out, "TRNUID", "1001");
-        Open(out, "STATUS");
-        Element(out, "CODE", "0");
-        Element(out, "SEVERITY", "INFO");
-        Close(out, "STATUS");
+        Status(out);
         Open(out, "STMTRS");
         Element(out, "CURDEF", "USD");
         Open(out, "BANKACCTFROM");
@@ -77,6 +71,14 @@ private:
         out += tag;
         out += ">\n";
     }
+    // A STATUS of code 0, severity INFO.
+    void Status(std::string& out) {
+        Open(out, "STATUS");
+        Element(out, "CODE", "0");
+        Element(out, "SEVERITY", "INFO");
+        Close(out, "STATUS");
+    }
+
     void Element(std::string& out, const char* tag, const std::string& value) {
         out += '<';
         out += tag;
@@ -109,16 +111,16 @@ private:
             Element(out, "MEMO", "Reference 4471-" + std::to_string(r % 100000) + " card ****1234");
         Close(out, "STMTTRN");
     }
+    void Balance(std::string& out, const char* tag, const char* amount) {
+        Open(out, tag);
+        Element(out, "BALAMT", amount);
+        Element(out, "DTASOF", "20240105120000");
+        Close(out, tag);
+    }
     std::string Tail() {
         std::string t;
-        Open(t, "LEDGERBAL");
-        Element(t, "BALAMT", "2517.42");
-        Element(t, "DTASOF", "20240105120000");
-        Close(t, "LEDGERBAL");
-        Open(t, "AVAILBAL");
-        Element(t, "BALAMT", "2017.42");
-        Element(t, "DTASOF", "20240105120000");
-        Close(t, "AVAILBAL");
+        Balance(t, "LEDGERBAL", "2517.42");
+        Balance(t, "AVAILBAL", "2017.42");
         Close(t, "STMTRS");
         Close(t, "STMTTRNRS");
         Close(t, "BANKMSGSRSV1");

@@ -400,10 +400,10 @@ OEBuildStatus OEBuilder::AddAmount(const OEPrecisionInteger& value) {
 OEBuildStatus OEBuilder::AddQuantity(const OEPrecisionInteger& value) {
     return AddPrecisionInteger(value);
 }
-OEBuildStatus OEBuilder::AddUnitPrice(const OEPrecisionInteger& value) {
+OEBuildStatus OEBuilder::AddUnitPrice(const OEPosPrecisionInteger& value) {
     return AddPrecisionInteger(value);
 }
-OEBuildStatus OEBuilder::AddRate(const OEPrecisionInteger& value) {
+OEBuildStatus OEBuilder::AddRate(OEPercent value) {
     return AddPrecisionInteger(value);
 }
 
@@ -426,37 +426,71 @@ OEBuildStatus OEBuilder::AddTime(const OETime& value) {
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddBankTxType(OEBankTxType value) {
-    OEString text;
-    if (!OEDataConversion::BankTxToString(value, text)) return OEBS_NOTEXTFORM;
+OEBuildStatus OEBuilder::PutKeywordLine(unsigned short converted, const OEString& text) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    if (!converted) return OEBS_NOTEXTFORM;
     Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
+    Put(OE_NEW_LINE, 1);
     return OEBS_OK;
 }
 
-OEBuildStatus OEBuilder::AddBankAccountType(OEBankAccountType value) {
-    OEString text;
-    if (!OEDataConversion::BankAccountToString(value, text)) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
-    return OEBS_OK;
+OEBuildStatus OEBuilder::AddKeywordString(unsigned short converted, const OEString& text) {
+    return converted ? AddString(text, OEBSM_NONE, OEBCL_NEWLINE) : OEBS_NOTEXTFORM;
 }
 
-OEBuildStatus OEBuilder::AddOFXSecurity(OEOFXSecurity value) {
-    OEString text;
-    if (!OEDataConversion::OFXSecurityToString(value, text)) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
-    return OEBS_OK;
-}
+// One enumeration value writer: Writer(Param value) converts with OEDataConversion::Stem##ToString
+// and hands the result to Emit (PutKeywordLine or AddKeywordString).
+#define OE_KEYWORD_WRITER(Writer, Param, Stem, Emit)                                                         \
+    OEBuildStatus OEBuilder::Writer(Param value) {                                                           \
+        OEString text;                                                                                       \
+        return Emit(OEDataConversion::Stem##ToString(value, text), text);                                    \
+    }
 
-OEBuildStatus OEBuilder::AddSyncMode(OESyncMode value) {
-    OEString text;
-    if (!OEDataConversion::SyncModeToString(value, text)) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
-    return OEBS_OK;
-}
+OE_KEYWORD_WRITER(AddBankTxType, OEBankTxType, BankTx, PutKeywordLine)
+OE_KEYWORD_WRITER(AddBankAction, OEBankAction, BankAction, PutKeywordLine)
+OE_KEYWORD_WRITER(AddProcCode, OEProcCode, ProcCode, PutKeywordLine)
+OE_KEYWORD_WRITER(AddDayOfWeek, OEDayOfWeek, DayOfWeek, PutKeywordLine)
+OE_KEYWORD_WRITER(AddClientRouting, OEClientRouting, ClientRouting, PutKeywordLine)
+OE_KEYWORD_WRITER(AddOFXSecurity, OEOFXSecurity, OFXSecurity, PutKeywordLine)
+OE_KEYWORD_WRITER(AddSyncMode, OESyncMode, SyncMode, PutKeywordLine)
+OE_KEYWORD_WRITER(AddCharacterType, OECharacterType, CharacterType, AddKeywordString)
+OE_KEYWORD_WRITER(AddBankAccountType, OEBankAccountType, BankAccount, PutKeywordLine)
+OE_KEYWORD_WRITER(AddService, OEService, Service, PutKeywordLine)
+OE_KEYWORD_WRITER(AddService2, OEService2, Service2, PutKeywordLine)
+OE_KEYWORD_WRITER(AddServiceStatus, OEServiceStatus, ServiceStatus, PutKeywordLine)
+OE_KEYWORD_WRITER(AddServiceStatus2, OEServiceStatus2, ServiceStatus2, PutKeywordLine)
+
+OE_KEYWORD_WRITER(AddBuyType, const OEBuyType&, BuyType, AddKeywordString)
+OE_KEYWORD_WRITER(AddCallType, const OECallType&, CallType, AddKeywordString)
+OE_KEYWORD_WRITER(AddDuration, const OEDuration&, Duration, AddKeywordString)
+OE_KEYWORD_WRITER(AddDebtClass, const OEDebtClass&, DebtClass, AddKeywordString)
+OE_KEYWORD_WRITER(AddDebtType, const OEDebtType&, DebtType, AddKeywordString)
+OE_KEYWORD_WRITER(AddIncomeType, const OEIncomeType&, IncomeType, AddKeywordString)
+OE_KEYWORD_WRITER(AddInvAcctType, const OEInvAcctType&, InvAcctType, AddKeywordString)
+OE_KEYWORD_WRITER(AddMFType, const OEMFType&, MFType, AddKeywordString)
+OE_KEYWORD_WRITER(AddOptAction, const OEOptAction&, OptAction, AddKeywordString)
+OE_KEYWORD_WRITER(AddOptBuyType, const OEOptBuyType&, OptBuyType, AddKeywordString)
+OE_KEYWORD_WRITER(AddFidelityOptBuyType, const OEFidelityOptBuyType&, FidelityOptBuyType, AddKeywordString)
+OE_KEYWORD_WRITER(AddSellReason, const OESellReason&, SellReason, AddKeywordString)
+OE_KEYWORD_WRITER(AddOptSellType, const OEOptSellType&, OptSellType, AddKeywordString)
+OE_KEYWORD_WRITER(AddFidelityOptSellType, const OEFidelityOptSellType&, FidelityOptSellType, AddKeywordString)
+OE_KEYWORD_WRITER(AddOptType, const OEOptType&, OptType, AddKeywordString)
+OE_KEYWORD_WRITER(AddPosType, const OEPosType&, PosType, AddKeywordString)
+OE_KEYWORD_WRITER(AddRelType, const OERelType&, RelType, AddKeywordString)
+OE_KEYWORD_WRITER(AddRestriction, const OERestriction&, Restriction, AddKeywordString)
+OE_KEYWORD_WRITER(AddSecured, const OESecured&, Secured, AddKeywordString)
+OE_KEYWORD_WRITER(AddSellType, const OESellType&, SellType, AddKeywordString)
+OE_KEYWORD_WRITER(AddStockType, const OEStockType&, StockType, AddKeywordString)
+OE_KEYWORD_WRITER(AddSubAcct, const OESubAcct&, SubAcct, AddKeywordString)
+OE_KEYWORD_WRITER(AddTferAction, const OETferAction&, TferAction, AddKeywordString)
+OE_KEYWORD_WRITER(AddUnitType, const OEUnitType&, UnitType, AddKeywordString)
+OE_KEYWORD_WRITER(AddUSProductType, const OEUSProductType&, USProductType, AddKeywordString)
+OE_KEYWORD_WRITER(AddBalType, const OEBalType&, BalType, AddKeywordString)
+OE_KEYWORD_WRITER(AddAssetClass, const OEAssetClass&, AssetClass, AddKeywordString)
+OE_KEYWORD_WRITER(AddCouponFreq, const OECouponFreq&, CouponFreq, AddKeywordString)
+OE_KEYWORD_WRITER(AddPayeeIDScope, const OEPayeeIDScope&, PayeeIDScope, AddKeywordString)
+
+#undef OE_KEYWORD_WRITER
 
 OEBuildStatus OEBuilder::AddServerID(const OEString36& value) {
     return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
@@ -555,14 +589,58 @@ OEBuildStatus OEBuilder::AddTagOEQuantity(OETagID tag, const OEPrecisionInteger&
     return s != OEBS_OK ? s : FinishElement(tag, AddQuantity(value));
 }
 
-OEBuildStatus OEBuilder::AddTagOEUnitPrice(OETagID tag, const OEPrecisionInteger& value) {
+OEBuildStatus OEBuilder::AddTagOEUnitPrice(OETagID tag, const OEPosPrecisionInteger& value) {
     OEBuildStatus s = AddTagElement(tag);
     return s != OEBS_OK ? s : FinishElement(tag, AddUnitPrice(value));
 }
 
-OEBuildStatus OEBuilder::AddTagOERate(OETagID tag, const OEPrecisionInteger& value) {
+OEBuildStatus OEBuilder::AddTagOERate(OETagID tag, const OEPercent& value) {
     OEBuildStatus s = AddTagElement(tag);
-    return s != OEBS_OK ? s : FinishElement(tag, AddRate(value));
+    return s != OEBS_OK ? s : FinishElement(tag, AddPrecisionInteger(value));
+}
+
+// One element writer over a value writer: element tag, Writer(value), end tag when asked for.
+#define OE_ELEMENT_WRITER(Element, Param, Writer)                                                            \
+    OEBuildStatus OEBuilder::Element(OETagID tag, Param value) {                                             \
+        OEBuildStatus s = AddTagElement(tag);                                                                \
+        return s != OEBS_OK ? s : FinishElement(tag, Writer(value));                                         \
+    }
+
+OE_ELEMENT_WRITER(AddTagOEDayOfWeek, OEDayOfWeek, AddDayOfWeek)
+OE_ELEMENT_WRITER(AddTagOEProcCode, OEProcCode, AddProcCode)
+OE_ELEMENT_WRITER(AddTagOEInvAcctType, const OEInvAcctType&, AddInvAcctType)
+OE_ELEMENT_WRITER(AddTagOEDebtType, const OEDebtType&, AddDebtType)
+OE_ELEMENT_WRITER(AddTagOEDebtClass, const OEDebtClass&, AddDebtClass)
+OE_ELEMENT_WRITER(AddTagOECallType, const OECallType&, AddCallType)
+OE_ELEMENT_WRITER(AddTagOEMFType, const OEMFType&, AddMFType)
+OE_ELEMENT_WRITER(AddTagOEOptType, const OEOptType&, AddOptType)
+OE_ELEMENT_WRITER(AddTagOEStockType, const OEStockType&, AddStockType)
+OE_ELEMENT_WRITER(AddTagOEBuyType, const OEBuyType&, AddBuyType)
+OE_ELEMENT_WRITER(AddTagOEIncomeType, const OEIncomeType&, AddIncomeType)
+OE_ELEMENT_WRITER(AddTagOEOptAction, const OEOptAction&, AddOptAction)
+OE_ELEMENT_WRITER(AddTagOEOptBuyType, const OEOptBuyType&, AddOptBuyType)
+OE_ELEMENT_WRITER(AddTagOEOptSellType, const OEOptSellType&, AddOptSellType)
+OE_ELEMENT_WRITER(AddTagOEPosType, const OEPosType&, AddPosType)
+OE_ELEMENT_WRITER(AddTagOERelType, const OERelType&, AddRelType)
+OE_ELEMENT_WRITER(AddTagOESecured, const OESecured&, AddSecured)
+OE_ELEMENT_WRITER(AddTagOESellReason, const OESellReason&, AddSellReason)
+OE_ELEMENT_WRITER(AddTagOESellType, const OESellType&, AddSellType)
+OE_ELEMENT_WRITER(AddTagOESubAcct, const OESubAcct&, AddSubAcct)
+OE_ELEMENT_WRITER(AddTagOETferAction, const OETferAction&, AddTferAction)
+OE_ELEMENT_WRITER(AddTagOEUnitType, const OEUnitType&, AddUnitType)
+OE_ELEMENT_WRITER(AddTagOEDuration, const OEDuration&, AddDuration)
+OE_ELEMENT_WRITER(AddTagOERestriction, const OERestriction&, AddRestriction)
+OE_ELEMENT_WRITER(AddTagOEBalType, const OEBalType&, AddBalType)
+OE_ELEMENT_WRITER(AddTagOEAssetClass, const OEAssetClass&, AddAssetClass)
+OE_ELEMENT_WRITER(AddTagOECouponFreq, const OECouponFreq&, AddCouponFreq)
+
+#undef OE_ELEMENT_WRITER
+
+OEBuildStatus OEBuilder::AddTagOEFrequency(OETagID tag, OEFrequency value) {
+    OEString text;
+    if (!OEDataConversion::FrequencyToString(value, text)) return OEBS_NOTEXTFORM;
+    OEBuildStatus s = AddTagElement(tag);
+    return s != OEBS_OK ? s : FinishElement(tag, AddString(text, OEBSM_NONE, OEBCL_NEWLINE));
 }
 
 OEBuildStatus OEBuilder::AddTagOEKeyword(OETagID tag, const char* keyword) {
@@ -581,6 +659,7 @@ unsigned short OEBuilder::AddBuffer(OEBuffer* other) {
 }
 
 OEBuildStatus OEPayrollBuilder::AddPayrollAmount(const OEPayrollAmount& value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
     const char* text = static_cast<const char*>(const_cast<OEPayrollAmount&>(value));
     if (text) Put(text);
     Put("\n", 1);
@@ -588,6 +667,7 @@ OEBuildStatus OEPayrollBuilder::AddPayrollAmount(const OEPayrollAmount& value) {
 }
 
 OEBuildStatus OEPayrollBuilder::AddPayrollDateTime(const OEPayrollDateTime& value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
     OEString text;
     const_cast<OEPayrollDateTime&>(value).GetDateString(text);
     Put(text.c_str(), text.GetStrLength());

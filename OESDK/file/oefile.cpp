@@ -308,172 +308,127 @@ unsigned short OEFileOFX::DeepCopyFrom(const OEFile* other) {
 
 // ================================================================ OEFileRq / OEFileRs
 
-namespace {
+OEFileBodies::OEFileBodies(unsigned short version, bool request)
+    : OEFileOFX(version), m_request(request), m_bodies(1, 1) {}
+OEFileBodies::~OEFileBodies() {}
 
-// An element directly under the file is an error: logged as OEPW_INVALIDELEM, status 4.
-OEParseStatus ElementUnderFile(OEDataObj* file, const OETagDictionaryEntry* entry, const OEString& value) {
+OEDataObj* OEFileBodies::NewBody(OEDataObjFactory* factory, unsigned short version) const {
+    return m_request ? static_cast<OEDataObj*>(factory->NewRequest(version))
+                     : static_cast<OEDataObj*>(factory->NewResponse(version));
+}
+
+unsigned short OEFileBodies::StoreBody(unsigned short index, OEDataObj* body) {
+    if (!body || index > m_bodies.Entries()) return 0;
+    return m_bodies.Set(index, body);
+}
+
+OEParseStatus OEFileBodies::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry || entry->m_id != OETAG_OFX) return OEDataObj::HandleTagStart(entry);
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return OEPS_NORESOURCE;
+    OEDataObj* body = NewBody(factory, OEDataObj::GetMsgSetVersion());
+    if (!body) {
+        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
+        return OEPS_NORESOURCE;
+    }
+    if (!m_bodies.Append(body)) {
+        delete body;
+        return OEPS_NORESOURCE;
+    }
+    body->SetType(OETAG_OFX);
+    // The file keeps no presence marks for its bodies (its valid table is open, so that an
+    // element directly under it reaches the handler below).
+    return PushAndSetObject(body, OETAG_NONE);
+}
+
+OEParseStatus OEFileBodies::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
     OELogParseWarning(OEPW_INVALIDELEM, entry ? entry->m_name : "", value.c_str(),
-                      entry ? entry->m_id : OETAG_NONE, file);
+                      entry ? entry->m_id : OETAG_NONE, this);
     return OEPS_INVALID;
 }
 
-} // namespace
-
-OEFileRq::OEFileRq(unsigned short version) : OEFileOFX(version), m_requests(1, 1) {
-    SetType(OETAG_OFXFILERQ);
-}
-OEFileRq::~OEFileRq() {}
-
-unsigned short OEFileRq::AppendRequest(OERequest* request) {
-    return SetRequest(m_requests.Entries(), request);
-}
-
-unsigned short OEFileRq::SetRequest(unsigned short index, OERequest* request) {
-    if (!request || index > m_requests.Entries()) return 0;
-    return m_requests.Set(index, request);
-}
-
-OERequest* OEFileRq::GetRequest(unsigned short index) const {
-    return static_cast<OERequest*>(m_requests.Get(index));
-}
-
-OEParseStatus OEFileRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry || entry->m_id != OETAG_OFX) return OEDataObj::HandleTagStart(entry);
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OERequest* request = factory->NewRequest(OEDataObj::GetMsgSetVersion());
-    if (!request) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
-    }
-    if (!m_requests.Append(request)) {
-        delete request;
-        return OEPS_NORESOURCE;
-    }
-    request->SetType(OETAG_OFX);
-    // The file keeps no presence marks for its bodies (its valid table is open, so that an
-    // element directly under it reaches the handler below).
-    return PushAndSetObject(request, OETAG_NONE);
-}
-
-OEParseStatus OEFileRq::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
-    return ElementUnderFile(this, entry, value);
-}
-
-int OEFileRq::Build(OEBuilder* builder) {
-    int headerStatus = OEFile::Build(builder);
-    for (unsigned short i = 0; i < m_requests.Entries(); ++i) {
-        OEDataObj* request = m_requests.Get(i);
-        if (!request) continue;
-        int status = request->BuildObject(builder, OETAG_NONE);
-        if (status != OEBS_OK) return status;
-    }
-    return headerStatus;
-}
-
-OEDataObj* OEFileRq::GetChild(unsigned short index) const {
-    if (index < m_requests.Entries()) return m_requests.Get(index);
-    return OEFile::GetChild(static_cast<unsigned short>(index - m_requests.Entries()));
-}
-
-unsigned short OEFileRq::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(m_requests.Entries() + OEFile::GetNumberOfChildren());
-}
-
-unsigned short OEFileRq::DeepCopyFrom(const OEFile* other) {
-    if (!OEFileOFX::DeepCopyFrom(other)) return 0;
-    const OEFileRq* rq = dynamic_cast<const OEFileRq*>(other);
-    if (!rq || rq == this) return 1;
-    m_requests.DeleteAll();
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    for (unsigned short i = 0; i < rq->m_requests.Entries(); ++i) {
-        OERequest* copy = factory->NewRequest(0);
-        if (!copy) return 0;
-        if (!m_requests.Append(copy)) {
-            delete copy;
-            return 0;
-        }
-        if (!copy->DeepCopyFrom(static_cast<const OERequest*>(rq->m_requests.Get(i)))) return 0;
-    }
-    return 1;
-}
-
-OEFileRs::OEFileRs(unsigned short version) : OEFileOFX(version), m_responses(1, 1) {
-    SetType(OETAG_OFXFILERS);
-}
-OEFileRs::~OEFileRs() {}
-
-unsigned short OEFileRs::AppendResponse(OEResponse* response) {
-    return SetResponse(m_responses.Entries(), response);
-}
-
-unsigned short OEFileRs::SetResponse(unsigned short index, OEResponse* response) {
-    if (!response || index > m_responses.Entries()) return 0;
-    return m_responses.Set(index, response);
-}
-
-OEResponse* OEFileRs::GetResponse(unsigned short index) const {
-    return static_cast<OEResponse*>(m_responses.Get(index));
-}
-
-OEParseStatus OEFileRs::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry || entry->m_id != OETAG_OFX) return OEDataObj::HandleTagStart(entry);
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OEResponse* response = factory->NewResponse(OEDataObj::GetMsgSetVersion());
-    if (!response) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
-    }
-    if (!m_responses.Append(response)) {
-        delete response;
-        return OEPS_NORESOURCE;
-    }
-    response->SetType(OETAG_OFX);
-    return PushAndSetObject(response, OETAG_NONE);
-}
-
-OEParseStatus OEFileRs::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
-    return ElementUnderFile(this, entry, value);
-}
-
-int OEFileRs::Build(OEBuilder* builder) {
-    int status = OEFile::Build(builder);
-    if (status != OEBS_OK) return status;
-    for (unsigned short i = 0; i < m_responses.Entries(); ++i) {
-        OEDataObj* response = m_responses.Get(i);
-        if (!response) continue;
-        status = response->BuildObject(builder, OETAG_NONE);
+int OEFileBodies::BuildBodies(OEBuilder* builder) {
+    for (unsigned short i = 0; i < m_bodies.Entries(); ++i) {
+        OEDataObj* body = m_bodies.Get(i);
+        if (!body) continue;
+        int status = body->BuildObject(builder, OETAG_NONE);
         if (status != OEBS_OK) return status;
     }
     return OEBS_OK;
 }
 
-OEDataObj* OEFileRs::GetChild(unsigned short index) const {
-    if (index < m_responses.Entries()) return m_responses.Get(index);
-    return OEFile::GetChild(static_cast<unsigned short>(index - m_responses.Entries()));
+OEDataObj* OEFileBodies::GetChild(unsigned short index) const {
+    if (index < m_bodies.Entries()) return m_bodies.Get(index);
+    return OEFile::GetChild(static_cast<unsigned short>(index - m_bodies.Entries()));
 }
 
-unsigned short OEFileRs::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(m_responses.Entries() + OEFile::GetNumberOfChildren());
+unsigned short OEFileBodies::GetNumberOfChildren() const {
+    return static_cast<unsigned short>(m_bodies.Entries() + OEFile::GetNumberOfChildren());
 }
 
-unsigned short OEFileRs::DeepCopyFrom(const OEFile* other) {
+unsigned short OEFileBodies::DeepCopyFrom(const OEFile* other) {
     if (!OEFileOFX::DeepCopyFrom(other)) return 0;
-    const OEFileRs* rs = dynamic_cast<const OEFileRs*>(other);
-    if (!rs || rs == this) return 1;
-    m_responses.DeleteAll();
+    // Bodies are copied only from a file of the same side.
+    const OEFileBodies* src = dynamic_cast<const OEFileBodies*>(other);
+    if (!src || src == this || src->m_request != m_request) return 1;
+    m_bodies.DeleteAll();
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
-    for (unsigned short i = 0; i < rs->m_responses.Entries(); ++i) {
-        OEResponse* copy = factory->NewResponse(0);
+    for (unsigned short i = 0; i < src->m_bodies.Entries(); ++i) {
+        OEDataObj* copy = NewBody(factory, 0);
         if (!copy) return 0;
-        if (!m_responses.Append(copy)) {
+        if (!m_bodies.Append(copy)) {
             delete copy;
             return 0;
         }
-        if (!copy->DeepCopyFrom(static_cast<const OEResponse*>(rs->m_responses.Get(i)))) return 0;
+        const OEDataObj* from = src->m_bodies.Get(i);
+        unsigned short ok =
+            m_request ? static_cast<OERequest*>(copy)->DeepCopyFrom(static_cast<const OERequest*>(from))
+                      : static_cast<OEResponse*>(copy)->DeepCopyFrom(static_cast<const OEResponse*>(from));
+        if (!ok) return 0;
     }
     return 1;
+}
+
+OEFileRq::OEFileRq(unsigned short version) : OEFileBodies(version, true) {
+    SetType(OETAG_OFXFILERQ);
+}
+
+unsigned short OEFileRq::AppendRequest(OERequest* request) {
+    return StoreBody(m_bodies.Entries(), request);
+}
+
+unsigned short OEFileRq::SetRequest(unsigned short index, OERequest* request) {
+    return StoreBody(index, request);
+}
+
+OERequest* OEFileRq::GetRequest(unsigned short index) const {
+    return static_cast<OERequest*>(m_bodies.Get(index));
+}
+
+int OEFileRq::Build(OEBuilder* builder) {
+    int headerStatus = OEFile::Build(builder);
+    int status = BuildBodies(builder);
+    return status != OEBS_OK ? status : headerStatus;
+}
+
+OEFileRs::OEFileRs(unsigned short version) : OEFileBodies(version, false) {
+    SetType(OETAG_OFXFILERS);
+}
+
+unsigned short OEFileRs::AppendResponse(OEResponse* response) {
+    return StoreBody(m_bodies.Entries(), response);
+}
+
+unsigned short OEFileRs::SetResponse(unsigned short index, OEResponse* response) {
+    return StoreBody(index, response);
+}
+
+OEResponse* OEFileRs::GetResponse(unsigned short index) const {
+    return static_cast<OEResponse*>(m_bodies.Get(index));
+}
+
+int OEFileRs::Build(OEBuilder* builder) {
+    int status = OEFile::Build(builder);
+    return status != OEBS_OK ? status : BuildBodies(builder);
 }

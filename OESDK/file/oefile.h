@@ -3,6 +3,7 @@
 //
 //   OEFile      headers, MIME data, subfiles (type MIME)
 //   OEFileOFX   the OFX header rules: defaults, the version header's choice, validation
+//   OEFileBodies  the bodies of a request or response file, in order
 //   OEFileRq    the requests of a file to send (type OFXFILERQ)
 //   OEFileRs    the responses of a file received (type OFXFILERS)
 #ifndef OESDK_FILE_OEFILE_H
@@ -49,6 +50,11 @@ public:
     const OEString& GetMIMEBody() const { return m_mimeBody; }
 
     // Stores a copy made through the factory, not the caller's object.
+    // Writing a multipart file: each part is built on its own (with its own header block unless
+    // it has the omit-headers flag), gets "content-length" (and "content-type" for an OFX request
+    // or response file), and is written as its headers (MIME, then OFX) followed by that text.
+    // So a part without the flag carries its OFX header block twice; give parts the flag to
+    // write the block once, with "content-length" counting the part's body.
     unsigned short AppendSubfile(const OEFile* subfile);
     unsigned short SetSubfile(unsigned short index, const OEFile* subfile);
     OEFile* GetSubfile(unsigned short index) const { return m_subfiles.Get(index); }
@@ -97,46 +103,53 @@ protected:
     unsigned short m_mfa;
 };
 
-class OE_API OEFileRq : public OEFileOFX {
+// The common part of the request and response files: the bodies (OFX aggregates) in order,
+// made through the factory. `request` selects the side.
+class OE_API OEFileBodies : public OEFileOFX {
+public:
+    OEFileBodies(unsigned short version, bool request);
+    ~OEFileBodies() override;
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    // An element directly under the file is an error: logged as OEPW_INVALIDELEM, status 4.
+    OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
+    using OEFileOFX::HandleTagElement;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    unsigned short DeepCopyFrom(const OEFile* other) override;
+
+protected:
+    // A null body or an index above the count is refused (0); equal to the count appends.
+    unsigned short StoreBody(unsigned short index, OEDataObj* body);
+    // Writes every body in order: the first failure's status, else 0.
+    int BuildBodies(OEBuilder* builder);
+
+    bool m_request;
+    OEPtrArray<OEDataObj> m_bodies;
+
+private:
+    OEDataObj* NewBody(OEDataObjFactory* factory, unsigned short version) const;
+};
+
+class OE_API OEFileRq : public OEFileBodies {
 public:
     explicit OEFileRq(unsigned short version = 0);
-    ~OEFileRq() override;
     unsigned short AppendRequest(OERequest* request);
     unsigned short SetRequest(unsigned short index, OERequest* request);
     OERequest* GetRequest(unsigned short index) const;
-    unsigned short GetNumberOfRequest() const { return m_requests.Entries(); }
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
-    using OEFileOFX::HandleTagElement;
+    unsigned short GetNumberOfRequest() const { return m_bodies.Entries(); }
     // The header block, then every request, even when the header block failed.
     int Build(OEBuilder* builder) override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short DeepCopyFrom(const OEFile* other) override;
-
-protected:
-    OEPtrArray<OEDataObj> m_requests;
 };
 
-class OE_API OEFileRs : public OEFileOFX {
+class OE_API OEFileRs : public OEFileBodies {
 public:
     explicit OEFileRs(unsigned short version = 0);
-    ~OEFileRs() override;
     unsigned short AppendResponse(OEResponse* response);
     unsigned short SetResponse(unsigned short index, OEResponse* response);
     OEResponse* GetResponse(unsigned short index) const;
-    unsigned short GetNumberOfResponse() const { return m_responses.Entries(); }
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
-    using OEFileOFX::HandleTagElement;
+    unsigned short GetNumberOfResponse() const { return m_bodies.Entries(); }
     // The header block, then every response; stops at once when the header block failed.
     int Build(OEBuilder* builder) override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short DeepCopyFrom(const OEFile* other) override;
-
-protected:
-    OEPtrArray<OEDataObj> m_responses;
 };
 
 #endif

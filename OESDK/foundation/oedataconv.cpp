@@ -214,36 +214,45 @@ unsigned short OEDataConversion::StringToLanguage(const char* text, OELanguage& 
 const char* const kAssetClassTable[] = {"DOMESTICBOND", "INTLBOND",  "LARGESTOCK", "SMALLSTOCK",
                                         "INTLSTOCK",    "MONEYMRKT", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, AssetClass, OEAssetClass, 0, kAssetClassTable)
+OE_KEYWORD_TABLE(OEKW_ASSETCLASS, kAssetClassTable)
 
 const char* const kBalTypeTable[] = {"DOLLAR", "PERCENT", "NUMBER"};
 OE_KEYWORD_PAIR(OEDataConversion, BalType, OEBalType, 0, kBalTypeTable)
+OE_KEYWORD_TABLE(OEKW_BALTYPE, kBalTypeTable)
 
 const char* const kBankAccountTable[] = {"UNKNOWN", "CHECKING",  "SAVINGS",
                                          "CREDIT",  "MONEYMRKT", "CREDITLINE"};
 OE_KEYWORD_PAIR(OEDataConversion, BankAccount, OEBankAccountType, 0, kBankAccountTable)
+OE_KEYWORD_TABLE(OEKW_BANKACCOUNTTYPE, kBankAccountTable)
 
 const char* const kBankAccount2Table[] = {"CHECKING", "SAVINGS", "MONEYMRKT", "CREDITLINE", "CMA"};
 OE_KEYWORD_PAIR(OEDataConversion, BankAccount2, OEBankAccountType2, 0, kBankAccount2Table)
+OE_KEYWORD_TABLE(OEKW_BANKACCOUNTTYPE2, kBankAccount2Table)
 
 const char* const kBankActionTable[] = {"REPLACE", "DELETE"};
 OE_KEYWORD_PAIR(OEDataConversion, BankAction, OEBankAction, 0, kBankActionTable)
+OE_KEYWORD_TABLE(OEKW_CORRECTACTION, kBankActionTable)
 
 const char* const kBankTxTable[] = {"CREDIT", "DEBIT",     "INT",         "DIV",       "FEE",   "SRVCHG",
                                     "DEP",    "ATM",       "POS",         "XFER",      "CHECK", "PAYMENT",
                                     "CASH",   "DIRECTDEP", "DIRECTDEBIT", "REPEATPMT", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, BankTx, OEBankTxType, 0, kBankTxTable)
+OE_KEYWORD_TABLE(OEKW_BANKTXTYPE, kBankTxTable)
 
 const char* const kBuyTypeTable[] = {"BUY", "BUYTOCOVER"};
 OE_KEYWORD_PAIR(OEDataConversion, BuyType, OEBuyType, 0, kBuyTypeTable)
 
 const char* const kCallTypeTable[] = {"CALL", "PUT", "PREFUND", "MATURITY"};
 OE_KEYWORD_PAIR(OEDataConversion, CallType, OECallType, 0, kCallTypeTable)
+OE_KEYWORD_TABLE(OEKW_CALLTYPE, kCallTypeTable)
 
 const char* const kCharacterTypeTable[] = {"ALPHAONLY", "NUMERICONLY", "ALPHAORNUMERIC", "ALPHAANDNUMERIC"};
 OE_KEYWORD_PAIR(OEDataConversion, CharacterType, OECharacterType, 0, kCharacterTypeTable)
+OE_KEYWORD_TABLE(OEKW_CHARTYPE, kCharacterTypeTable)
 
 const char* const kClientRoutingTable[] = {"NONE", "SERVICE", "MSGSET"};
 OE_KEYWORD_PAIR(OEDataConversion, ClientRouting, OEClientRouting, 0, kClientRoutingTable)
+OE_KEYWORD_TABLE(OEKW_CLIENTROUTING, kClientRoutingTable)
 
 const char* const kCouponFreqTable[] = {"MONTHLY", "QUARTERLY", "SEMIANNUAL", "ANNUAL", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, CouponFreq, OECouponFreq, 0, kCouponFreqTable)
@@ -257,9 +266,11 @@ OE_KEYWORD_PAIR(OEDataConversion, DebtAction, OEDebtAction, 0, kDebtActionTable)
 
 const char* const kDebtClassTable[] = {"TREASURY", "MUNICIPAL", "CORPORATE", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, DebtClass, OEDebtClass, 0, kDebtClassTable)
+OE_KEYWORD_TABLE(OEKW_DEBTCLASS, kDebtClassTable)
 
 const char* const kDebtTypeTable[] = {"COUPON", "ZERO"};
 OE_KEYWORD_PAIR(OEDataConversion, DebtType, OEDebtType, 0, kDebtTypeTable)
+OE_KEYWORD_TABLE(OEKW_DEBTTYPE, kDebtTypeTable)
 
 const char* const kDurationTable[] = {"DAY", "GOODTILCANCEL", "IMMEDIATE"};
 OE_KEYWORD_PAIR(OEDataConversion, Duration, OEDuration, 0, kDurationTable)
@@ -290,6 +301,7 @@ OE_KEYWORD_PAIR(OEDataConversion, InvAcctType, OEInvAcctType, 0, kInvAcctTypeTab
 
 const char* const kMFTypeTable[] = {"OPENEND", "CLOSEEND", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, MFType, OEMFType, 0, kMFTypeTable)
+OE_KEYWORD_TABLE(OEKW_MFTYPE, kMFTypeTable)
 
 const char* const kOFXCharSetTable[] = {"1252"};
 OE_KEYWORD_PAIR(OEDataConversion, OFXCharSet, OEOFXCharSet, 0, kOFXCharSetTable)
@@ -308,6 +320,7 @@ OE_KEYWORD_PAIR(OEDataConversion, OFXFileUID, OEOFXFileUID, 0, kOFXFileUIDTable)
 
 const char* const kOFXSecurityTable[] = {"NONE", "TYPE1"};
 OE_KEYWORD_PAIR(OEDataConversion, OFXSecurity, OEOFXSecurity, 0, kOFXSecurityTable)
+OE_KEYWORD_TABLE(OEKW_OFXSECURITY, kOFXSecurityTable)
 
 const char* const kOptActionTable[] = {"EXERCISE", "ASSIGN", "EXPIRE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptAction, OEOptAction, 0, kOptActionTable)
@@ -360,15 +373,18 @@ OE_KEYWORD_PAIR(OEDataConversion, ServiceStatus2, OEServiceStatus2, 0, kServiceS
 
 const char* const kStatusSeverityTable[] = {"INFO", "WARN", "ERROR"};
 OE_KEYWORD_PAIR(OEDataConversion, StatusSeverity, OEStatusSeverity, 0, kStatusSeverityTable)
+OE_KEYWORD_TABLE(OEKW_SEVERITY, kStatusSeverityTable)
 
 const char* const kStockTypeTable[] = {"COMMON", "PREFERRED", "CONVERTIBLE", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, StockType, OEStockType, 0, kStockTypeTable)
+OE_KEYWORD_TABLE(OEKW_STOCKTYPE, kStockTypeTable)
 
 const char* const kSubAcctTable[] = {"CASH", "MARGIN", "SHORT", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, SubAcct, OESubAcct, 0, kSubAcctTable)
 
 const char* const kSyncModeTable[] = {"FULL", "LITE"};
 OE_KEYWORD_PAIR(OEDataConversion, SyncMode, OESyncMode, 0, kSyncModeTable)
+OE_KEYWORD_TABLE(OEKW_SYNCMODE, kSyncModeTable)
 
 const char* const kTferActionTable[] = {"IN", "OUT"};
 OE_KEYWORD_PAIR(OEDataConversion, TferAction, OETferAction, 0, kTferActionTable)

@@ -21,6 +21,30 @@
 
 #include <cstdint>
 
+// A keyword table of an enumeration: keyword i is the text of value i. The aggregates' enumeration
+// elements use the conversions' own tables below, so each enumeration's words exist once.
+struct OEKeywordTable {
+    const char* const* m_words;
+    unsigned short m_count;
+};
+
+extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE;  // ACCTTYPE: "UNKNOWN", "CHECKING", ...
+extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE2; // ACCTTYPE2: "CHECKING", "SAVINGS", ...
+extern OE_API const OEKeywordTable OEKW_BALTYPE;          // "DOLLAR", "PERCENT", "NUMBER"
+extern OE_API const OEKeywordTable OEKW_BANKTXTYPE;       // TRNTYPE: "CREDIT" ... "OTHER" (17)
+extern OE_API const OEKeywordTable OEKW_CORRECTACTION;    // "REPLACE", "DELETE"
+extern OE_API const OEKeywordTable OEKW_OFXSECURITY;      // "NONE", "TYPE1"
+extern OE_API const OEKeywordTable OEKW_SYNCMODE;         // "FULL", "LITE"
+extern OE_API const OEKeywordTable OEKW_CHARTYPE;         // "ALPHAONLY", "NUMERICONLY", ...
+extern OE_API const OEKeywordTable OEKW_CLIENTROUTING;    // "NONE", "SERVICE", "MSGSET"
+extern OE_API const OEKeywordTable OEKW_SEVERITY;         // "INFO", "WARN", "ERROR"
+extern OE_API const OEKeywordTable OEKW_ASSETCLASS;       // "DOMESTICBOND" ... "OTHER"
+extern OE_API const OEKeywordTable OEKW_DEBTTYPE;         // "COUPON", "ZERO"
+extern OE_API const OEKeywordTable OEKW_DEBTCLASS;        // "TREASURY" ... "OTHER"
+extern OE_API const OEKeywordTable OEKW_CALLTYPE;         // "CALL", "PUT", "PREFUND", "MATURITY"
+extern OE_API const OEKeywordTable OEKW_MFTYPE;           // "OPENEND", "CLOSEEND", "OTHER"
+extern OE_API const OEKeywordTable OEKW_STOCKTYPE;        // "COMMON" ... "OTHER"
+
 class OE_API OEDataConversion {
 public:
     // The keyword of value (first <= value <= last); otherwise warning 4, out emptied, 0.

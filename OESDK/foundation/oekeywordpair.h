@@ -13,4 +13,8 @@
                              static_cast<unsigned short>(sizeof(Table) / sizeof(Table[0]) - 1), Table);      \
     }
 
+// The same table as an OEKeywordTable, for the aggregates' enumeration elements.
+#define OE_KEYWORD_TABLE(Name, Table)                                                                        \
+    const OEKeywordTable Name = {Table, static_cast<unsigned short>(sizeof(Table) / sizeof(Table[0]))};
+
 #endif

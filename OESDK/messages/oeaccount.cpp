@@ -4,9 +4,6 @@
 
 namespace {
 
-const char* const kAcctType[] = {"UNKNOWN", "CHECKING", "SAVINGS", "CREDIT", "MONEYMRKT", "CREDITLINE"};
-const char* const kAcctType2[] = {"CHECKING", "SAVINGS", "MONEYMRKT", "CREDITLINE", "CMA"};
-const char* const kBalType[] = {"DOLLAR", "PERCENT", "NUMBER"};
 
 // ---- BANKACCTFROM / BANKACCTTO ----
 const OETagRow kBankAcctValid[] = {{OETAG_BANKID, OEVM_ALL, 0},      {OETAG_BRANCHID, OEVM_ALL, 0},
@@ -90,9 +87,6 @@ const OEAggregateDesc kPayee2Desc = OE_DESC(OETAG_PAYEE2, kPayeeValid, kPayee2Re
 
 } // namespace
 
-const OEKeywordTable OEKW_BANKACCOUNTTYPE = {kAcctType, 6};
-const OEKeywordTable OEKW_BANKACCOUNTTYPE2 = {kAcctType2, 5};
-const OEKeywordTable OEKW_BALTYPE = {kBalType, 3};
 
 OEBankAccount::OEBankAccount(unsigned short version) : OEBankOrCCAccount(version) {
     SetType(OETAG_BANKACCTFROM);

@@ -4,9 +4,6 @@
 #include "messages/oeaggregate.h"
 
 // Keyword tables of the enumerations these aggregates hold (value i = keyword i).
-extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE;  // ACCTTYPE: "UNKNOWN", "CHECKING", ...
-extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE2; // ACCTTYPE2: "CHECKING", "SAVINGS", ...
-extern OE_API const OEKeywordTable OEKW_BALTYPE;          // "DOLLAR", "PERCENT", "NUMBER"
 
 // The common base of every account aggregate. The same class serves the FROM and the TO form; the
 // tag is chosen when the object is made.

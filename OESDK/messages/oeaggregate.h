@@ -17,6 +17,7 @@
 #include "foundation/oestring.h"
 #include "foundation/oeprecision.h"
 #include "foundation/oedatetime.h"
+#include "foundation/oedataconv.h"
 #include "tags/oedataobj.h"
 #include "tags/oedatafactory.h"
 
@@ -37,12 +38,6 @@ enum OEFieldKind : unsigned char {
     OEFK_CHILD,    // one owned child aggregate (OEOwnedChild); rows may share one slot
     OEFK_LIST,     // an owned, ordered list of child aggregates (OEPtrArray<OEDataObj>)
     OEFK_TEXTLIST  // a repeated element: an OEDynamicArrayString, one element per entry
-};
-
-// A keyword table of an enumeration: keyword i is value i.
-struct OEKeywordTable {
-    const char* const* m_words;
-    unsigned short m_count;
 };
 
 // One field row. `m_member` hands out the address of the value inside a given object; a captureless
@@ -89,6 +84,13 @@ struct OEAggregateDesc {
     OEAggregateDesc {                                                                                        \
         tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), required,                 \
             static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields,                     \
+            static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
+    }
+// The same for a class without required rows, whose AllRequiredPresent states the whole rule (the
+// required table is empty: it points at the valid rows with a count of 0).
+#define OE_DESC_NO_REQUIRED(tag, valid, fields)                                                              \
+    OEAggregateDesc {                                                                                        \
+        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), valid, 0, fields,         \
             static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
     }
 

@@ -6,10 +6,6 @@
 
 namespace {
 
-const char* const kTxType[] = {"CREDIT", "DEBIT",     "INT",         "DIV",       "FEE",   "SRVCHG",
-                               "DEP",    "ATM",       "POS",         "XFER",      "CHECK", "PAYMENT",
-                               "CASH",   "DIRECTDEP", "DIRECTDEBIT", "REPEATPMT", "OTHER"};
-const char* const kCorrectAction[] = {"REPLACE", "DELETE"};
 
 // ---- STMTTRN ----
 const OETagRow kTxValid[] = {
@@ -140,8 +136,6 @@ const OEAggregateDesc kCCStmtRqDesc =
 
 } // namespace
 
-const OEKeywordTable OEKW_BANKTXTYPE = {kTxType, 17};
-const OEKeywordTable OEKW_CORRECTACTION = {kCorrectAction, 2};
 
 // ---------------------------------------------------------------- STMTTRN
 
@@ -181,7 +175,7 @@ unsigned short OEBankStatementTx::SetCurrency(OEDataObj* currency) {
 
 // ---------------------------------------------------------------- BANKTRANLIST
 
-OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEAggregate(version), m_tx(16, 512) {
+OEBankTransactionList::OEBankTransactionList(unsigned short version) : OEDateRangeOf(version), m_tx(16, 512) {
     SetType(OETAG_BANKTRANLIST);
 }
 const OEAggregateDesc& OEBankTransactionList::Describe() const {
@@ -208,7 +202,7 @@ void OEBankTransactionList::DeleteAllStatementTx() {
 
 // ---------------------------------------------------------------- INCTRAN
 
-OEIncTransaction::OEIncTransaction(unsigned short version) : OEAggregate(version) {
+OEIncTransaction::OEIncTransaction(unsigned short version) : OEDateRangeOf(version) {
     SetType(OETAG_INCTRAN);
 }
 const OEAggregateDesc& OEIncTransaction::Describe() const {
@@ -217,14 +211,14 @@ const OEAggregateDesc& OEIncTransaction::Describe() const {
 
 // ---------------------------------------------------------------- STMTRS / CCSTMTRS
 
-OEBankStatementRs::OEBankStatementRs(unsigned short version) : OETransBase(version) {
+OEBankStatementRs::OEBankStatementRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTRS);
 }
 const OEAggregateDesc& OEBankStatementRs::Describe() const {
     return kStmtRsDesc;
 }
 
-OECCStatementRs::OECCStatementRs(unsigned short version) : OETransBase(version) {
+OECCStatementRs::OECCStatementRs(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTRS);
 }
 const OEAggregateDesc& OECCStatementRs::Describe() const {
@@ -253,14 +247,14 @@ OEParseStatus OEGenericStatementRq::HandleTagStart(const OETagDictionaryEntry* e
     return PushAndSetObject(child, entry->m_id);
 }
 
-OEBankStatementRq::OEBankStatementRq(unsigned short version) : OEGenericStatementRq(version) {
+OEBankStatementRq::OEBankStatementRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_STMTRQ);
 }
 const OEAggregateDesc& OEBankStatementRq::Describe() const {
     return kStmtRqDesc;
 }
 
-OECCStatementRq::OECCStatementRq(unsigned short version) : OEGenericStatementRq(version) {
+OECCStatementRq::OECCStatementRq(unsigned short version) : OEAccountFromOf(version) {
     SetType(OETAG_CCSTMTRQ);
 }
 const OEAggregateDesc& OECCStatementRq::Describe() const {

@@ -5,9 +5,6 @@
 #include "messages/oeaccount.h"
 #include "messages/oetrans.h"
 
-extern OE_API const OEKeywordTable OEKW_BANKTXTYPE;    // TRNTYPE: "CREDIT" ... "OTHER" (17)
-extern OE_API const OEKeywordTable OEKW_CORRECTACTION; // "REPLACE", "DELETE"
-
 // STMTTRN: one statement transaction.
 class OE_API OEBankStatementTx : public OEAggregate {
 public:
@@ -91,17 +88,26 @@ public:
     OEOwnedChild m_accountTo;
 };
 
+// The DTSTART / DTEND pair of a transaction list, of INCTRAN and of the statement-end requests,
+// over the class Base.
+template <class Base> class OEDateRangeOf : public Base {
+public:
+    explicit OEDateRangeOf(unsigned short version = 0) : Base(version) {}
+    const OEDateTime* GetDateStart() const { return this->GetDateTime(OETAG_DTSTART); }
+    unsigned short SetDateStart(const OEString& v) { return this->SetFromText(OETAG_DTSTART, v); }
+    unsigned short SetDateStart(const OEDateTime& v) { return this->SetDateTime(OETAG_DTSTART, v); }
+    const OEDateTime* GetDateEnd() const { return this->GetDateTime(OETAG_DTEND); }
+    unsigned short SetDateEnd(const OEString& v) { return this->SetFromText(OETAG_DTEND, v); }
+    unsigned short SetDateEnd(const OEDateTime& v) { return this->SetDateTime(OETAG_DTEND, v); }
+
+    OEDateTime m_dtStart, m_dtEnd;
+};
+
 // BANKTRANLIST: DTSTART, DTEND and the transactions in order.
-class OE_API OEBankTransactionList : public OEAggregate {
+class OE_API OEBankTransactionList : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEBankTransactionList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
     unsigned short AppendStatementTx(OEBankStatementTx* tx) { return AppendToList(OETAG_STMTTRN, tx); }
     // Replaces the entry at index (index equal to the count appends); the old one is deleted.
     unsigned short SetStatementTx(unsigned short index, OEBankStatementTx* tx);
@@ -113,42 +119,29 @@ public:
     void ClearStatementTx();
     void DeleteAllStatementTx();
 
-    OEDateTime m_dtStart, m_dtEnd;
     OEDataObjList m_tx;
 };
 
 // INCTRAN: DTSTART, DTEND, INCLUDE (required).
-class OE_API OEIncTransaction : public OEAggregate {
+class OE_API OEIncTransaction : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEIncTransaction(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDateStart() const { return GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTEND, v); }
     unsigned short GetInclude() const { return static_cast<unsigned short>(GetNumber(OETAG_INCLUDE)); }
     unsigned short SetInclude(const OEString& v) { return SetFromText(OETAG_INCLUDE, v); }
     unsigned short SetInclude(unsigned short v) { return SetNumber(OETAG_INCLUDE, v); }
 
-    OEDateTime m_dtStart, m_dtEnd;
     unsigned short m_include = 0;
 };
 
-// STMTRS.
-class OE_API OEBankStatementRs : public OETransBase {
+// The base of the statement responses: everything but the account, which each names itself.
+class OE_API OEGenericStatementRs : public OETransBase {
 public:
-    explicit OEBankStatementRs(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    explicit OEGenericStatementRs(unsigned short version = 0) : OETransBase(version) {}
     const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
     unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
     const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
     unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
     OEBankTransactionList* GetTransactionList() const {
         return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
     }
@@ -167,33 +160,28 @@ public:
     OEString360 m_mktgInfo;
 };
 
-// CCSTMTRS: the same pattern with CCACCTFROM.
-class OE_API OECCStatementRs : public OETransBase {
+// Typed access to the FROM account of a statement or statement-end aggregate: OEBankAccount for
+// BANKACCTFROM, OECCAccount for CCACCTFROM.
+template <class Base, class Account, OETagID Tag> class OEAccountFromOf : public Base {
+public:
+    explicit OEAccountFromOf(unsigned short version = 0) : Base(version) {}
+    Account* GetAccountFrom() const { return static_cast<Account*>(this->GetChildObj(Tag)); }
+    unsigned short SetAccountFrom(Account* account) { return this->SetChildObj(Tag, account); }
+};
+
+// STMTRS.
+class OE_API OEBankStatementRs
+    : public OEAccountFromOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM> {
+public:
+    explicit OEBankStatementRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+};
+
+// CCSTMTRS: the same with CCACCTFROM.
+class OE_API OECCStatementRs : public OEAccountFromOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
-    unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
-    const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
-    unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
-    OEBankTransactionList* GetTransactionList() const {
-        return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
-    }
-    unsigned short SetTransactionList(OEBankTransactionList* l) { return SetChildObj(OETAG_BANKTRANLIST, l); }
-    OELedgerBalance* GetLedgerBalance() const {
-        return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL));
-    }
-    unsigned short SetLedgerBalance(OELedgerBalance* b) { return SetChildObj(OETAG_LEDGERBAL, b); }
-    OEAvailableBalance* GetAvailableBalance() const {
-        return static_cast<OEAvailableBalance*>(GetChildObj(OETAG_AVAILBAL));
-    }
-    unsigned short SetAvailableBalance(OEAvailableBalance* b) { return SetChildObj(OETAG_AVAILBAL, b); }
-
-    OEString3 m_curDef;
-    OEOwnedChild m_account, m_tranList, m_ledgerBal, m_availBal;
-    OEString360 m_mktgInfo;
 };
 
 // The base of the statement requests: one account and at most one INCTRAN.
@@ -212,23 +200,18 @@ public:
 };
 
 // STMTRQ.
-class OE_API OEBankStatementRq : public OEGenericStatementRq {
+class OE_API OEBankStatementRq
+    : public OEAccountFromOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM> {
 public:
     explicit OEBankStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankAccount* GetAccountFrom() const {
-        return static_cast<OEBankAccount*>(GetChildObj(OETAG_BANKACCTFROM));
-    }
-    unsigned short SetAccountFrom(OEBankAccount* a) { return SetChildObj(OETAG_BANKACCTFROM, a); }
 };
 
 // CCSTMTRQ.
-class OE_API OECCStatementRq : public OEGenericStatementRq {
+class OE_API OECCStatementRq : public OEAccountFromOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM> {
 public:
     explicit OECCStatementRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OECCAccount* GetAccountFrom() const { return static_cast<OECCAccount*>(GetChildObj(OETAG_CCACCTFROM)); }
-    unsigned short SetAccountFrom(OECCAccount* a) { return SetChildObj(OETAG_CCACCTFROM, a); }
 };
 
 #endif

@@ -5,9 +5,12 @@
 #include "file/oefile.h"
 #include "foundation/oelanguage.h"
 #include "messages/oebank.h"
+#include "messages/oechallenge.h"
 #include "messages/oecurrency.h"
 #include "messages/oemsgset.h"
 #include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
+#include "messages/oeseclist.h"
 
 OEFile* OEDataObjFactory::NewFile(unsigned short version) {
     return Create<OEFile>(version);
@@ -122,4 +125,91 @@ OEMessageSetProfile* OEDataObjFactory::NewMessageSetProfile(unsigned short versi
 }
 OEMessageSetList* OEDataObjFactory::NewMessageSetList(unsigned short version) {
     return Create<OEMessageSetList>(version);
+}
+OEChallengeRs* OEDataObjFactory::NewChallengeRs(unsigned short version) {
+    return Create<OEChallengeRs>(version);
+}
+OEChallengeRq* OEDataObjFactory::NewChallengeRq(unsigned short version) {
+    return Create<OEChallengeRq>(version);
+}
+OESignOnInfo* OEDataObjFactory::NewSignOnInfo(unsigned short version) {
+    return Create<OESignOnInfo>(version);
+}
+OESignOnInfoList* OEDataObjFactory::NewSignOnInfoList(unsigned short version) {
+    return Create<OESignOnInfoList>(version);
+}
+OEProfileRq* OEDataObjFactory::NewProfileRq(unsigned short version) {
+    return Create<OEProfileRq>(version);
+}
+OEProfileRs* OEDataObjFactory::NewProfileRs(unsigned short version) {
+    return Create<OEProfileRs>(version);
+}
+OEClosing* OEDataObjFactory::NewClosing(unsigned short version) {
+    return Create<OEClosing>(version);
+}
+OEStatementEndRs* OEDataObjFactory::NewStatementEndRs(unsigned short version) {
+    return Create<OEStatementEndRs>(version);
+}
+OEStatementEndRq* OEDataObjFactory::NewStatementEndRq(unsigned short version) {
+    return Create<OEStatementEndRq>(version);
+}
+OECCClosing* OEDataObjFactory::NewCCClosing(unsigned short version) {
+    return Create<OECCClosing>(version);
+}
+OECCStatementEndRs* OEDataObjFactory::NewCCStatementEndRs(unsigned short version) {
+    return Create<OECCStatementEndRs>(version);
+}
+OECCStatementEndRq* OEDataObjFactory::NewCCStatementEndRq(unsigned short version) {
+    return Create<OECCStatementEndRq>(version);
+}
+OEMultiTransRq* OEDataObjFactory::NewMultiTransRq(unsigned short version) {
+    return Create<OEMultiTransRq>(version);
+}
+OEMultiTransRs* OEDataObjFactory::NewMultiTransRs(unsigned short version) {
+    return Create<OEMultiTransRs>(version);
+}
+OEFIMFAssetClass* OEDataObjFactory::NewFIMFAssetClass(unsigned short version) {
+    return Create<OEFIMFAssetClass>(version);
+}
+OEMFAssetClass* OEDataObjFactory::NewMFAssetClass(unsigned short version) {
+    return Create<OEMFAssetClass>(version);
+}
+OEPortion* OEDataObjFactory::NewPortion(unsigned short version) {
+    return Create<OEPortion>(version);
+}
+OEFIPortion* OEDataObjFactory::NewFIPortion(unsigned short version) {
+    return Create<OEFIPortion>(version);
+}
+OEDebtInfo* OEDataObjFactory::NewDebtInfo(unsigned short version) {
+    return Create<OEDebtInfo>(version);
+}
+OEMFInfo* OEDataObjFactory::NewMFInfo(unsigned short version) {
+    return Create<OEMFInfo>(version);
+}
+OEOptInfo* OEDataObjFactory::NewOptInfo(unsigned short version) {
+    return Create<OEOptInfo>(version);
+}
+OEOtherInfo* OEDataObjFactory::NewOtherInfo(unsigned short version) {
+    return Create<OEOtherInfo>(version);
+}
+OEStockInfo* OEDataObjFactory::NewStockInfo(unsigned short version) {
+    return Create<OEStockInfo>(version);
+}
+OESecID* OEDataObjFactory::NewSecID(unsigned short version) {
+    return Create<OESecID>(version);
+}
+OESecInfo* OEDataObjFactory::NewSecInfo(unsigned short version) {
+    return Create<OESecInfo>(version);
+}
+OESecList* OEDataObjFactory::NewSecList(unsigned short version) {
+    return Create<OESecList>(version);
+}
+OESecRq* OEDataObjFactory::NewSecRq(unsigned short version) {
+    return Create<OESecRq>(version);
+}
+OESecListRs* OEDataObjFactory::NewSecListRs(unsigned short version) {
+    return Create<OESecListRs>(version);
+}
+OESecListRq* OEDataObjFactory::NewSecListRq(unsigned short version) {
+    return Create<OESecListRq>(version);
 }

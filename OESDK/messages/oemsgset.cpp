@@ -55,9 +55,8 @@ const std::vector<Family>& Families() {
          OETAG_EMAILMSGSRQV2,
          {OETAG_MAILTRNRQ, OETAG_MAILSYNCRQ, OETAG_GETMIMETRNRQ},
          {}},
-        // The security list (SECLIST) of the response side is held by a class that is not part of
-        // the library yet; until it is, the parser skips it as not valid here.
-        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {}},
+        // The response side's SECLIST follows its wrappers.
+        {OETAG_SECLISTMSGSRQV1, OETAG_SECLISTMSGSRQV2, {OETAG_SECLISTTRNRQ}, {OETAG_SECLIST}},
         {OETAG_PROFMSGSRQV1, OETAG_PROFMSGSRQV2, {OETAG_PROFTRNRQ}, {}},
         {OETAG_KEST_BRANDMSGSRQV1,
          OETAG_KEST_BRANDMSGSRQV2,
@@ -72,6 +71,16 @@ const std::vector<Family>& Families() {
         {OETAG_K_EFILEMSGSRQV1, OETAG_NONE, {OETAG_K_EFILESYNCRQ}, {OETAG_K_EFILETRNRS}},
     };
     return families;
+}
+
+// A new transaction wrapper for a tag: the multiple interbank wrappers have classes of their own,
+// every other tag gets the plain wrapper.
+OEDataObj* NewWrapper(OEDataObjFactory* factory, bool request, OETagID tag, unsigned short version) {
+    if (request)
+        return tag == OETAG_MULTIINTERTRNRQ ? static_cast<OEDataObj*>(factory->NewMultiTransRq(version))
+                                            : static_cast<OEDataObj*>(factory->NewTransRq(version));
+    return tag == OETAG_MULTIINTERTRNRS ? static_cast<OEDataObj*>(factory->NewMultiTransRs(version))
+                                        : static_cast<OEDataObj*>(factory->NewTransRs(version));
 }
 
 // The valid rows of each wrapper, both sides, built once from the families.
@@ -160,7 +169,7 @@ const OETagID kRootBuildOrder[] = {
     OETAG_KEST_SURVEYMSGSRQV1, OETAG_KEST_SURVEYMSGSRQV2, OETAG_KEST_USLFIMSGSRQV1, OETAG_KEST_USLFIMSGSRQV2,
     OETAG_KEST_USLCUMSGSRQV1,  OETAG_KEST_USLCUMSGSRQV2,  OETAG_K_PAYROLLMSGSRQV1,  OETAG_K_EFILEMSGSRQV1};
 
-// Copies the tree of one list entry into a fresh object (transaction wrapper or sync).
+// Copies the tree of one child into an object of its class (sign-on, transaction wrapper or sync).
 template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
     return to->DeepCopyFrom(static_cast<const T*>(from));
 }
@@ -170,10 +179,12 @@ template <class T> unsigned short CopyEntry(T* to, const OEDataObj* from) {
 // ================================================================ message sets
 
 OEMessageSetBase::OEMessageSetBase(unsigned short version, bool request)
-    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr) {}
+    : OEDataObj(version), m_request(request), m_trans(1, 5), m_sync(1, 5), m_signOn(nullptr),
+      m_secList(nullptr) {}
 
 OEMessageSetBase::~OEMessageSetBase() {
     delete m_signOn;
+    delete m_secList;
 }
 
 unsigned short OEMessageSetBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
@@ -197,25 +208,56 @@ OEDataObj* OEMessageSetBase::GetChild(unsigned short index) const {
         --index;
     }
     if (index < m_trans.Entries()) return m_trans.Get(index);
-    return m_sync.Get(static_cast<unsigned short>(index - m_trans.Entries()));
+    index = static_cast<unsigned short>(index - m_trans.Entries());
+    if (index < m_sync.Entries()) return m_sync.Get(index);
+    return index == m_sync.Entries() ? m_secList : nullptr;
 }
 
 unsigned short OEMessageSetBase::GetNumberOfChildren() const {
-    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries());
+    return static_cast<unsigned short>((m_signOn ? 1 : 0) + m_trans.Entries() + m_sync.Entries() +
+                                       (m_secList ? 1 : 0));
 }
 
-OEParseStatus OEMessageSetBase::PushSignOn(const OETagDictionaryEntry* entry) {
+OEParseStatus OEMessageSetBase::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    OETagID tag = entry->m_id;
+    if (tag == SignOnTag()) return PushSingle(entry);
+    const WrapperTables* t = TablesOf(GetType());
+    bool listed = false;
+    if (t)
+        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
+    if (!listed) return OEPS_INVALID;
+    if (tag == OETAG_SECLIST) return PushSingle(entry); // listed on the response side only
+    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
+}
+
+OEParseStatus OEMessageSetBase::PushSingle(const OETagDictionaryEntry* entry) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    if (m_signOn) {
+    bool secList = entry->m_id == OETAG_SECLIST;
+    OEDataObj*& slot = secList ? m_secList : m_signOn;
+    if (slot) {
         OELogParseWarning(OEPW_EXTRAAGG, "", "", entry->m_id, this);
-        delete m_signOn;
-        m_signOn = nullptr;
+        delete slot;
+        slot = nullptr;
     }
-    m_signOn = m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(GetMsgSetVersion()))
-                         : static_cast<OEDataObj*>(factory->NewSignOnRs(GetMsgSetVersion()));
-    if (!m_signOn) return OEPS_NORESOURCE;
-    return PushAndSetObject(m_signOn, entry->m_id);
+    unsigned short v = GetMsgSetVersion();
+    slot = secList ? factory->NewSecList(v) : NewSignOn(factory, v);
+    if (!slot) return OEPS_NORESOURCE;
+    return PushAndSetObject(slot, entry->m_id);
+}
+
+OEDataObj* OEMessageSetBase::NewSignOn(OEDataObjFactory* factory, unsigned short version) const {
+    return m_request ? static_cast<OEDataObj*>(factory->NewSignOnRq(version))
+                     : static_cast<OEDataObj*>(factory->NewSignOnRs(version));
+}
+
+unsigned short OEMessageSetBase::StoreSignOn(OEDataObj* signOn) {
+    if (m_signOn != signOn) delete m_signOn;
+    if (!signOn) ClearTag(SignOnTag());
+    m_signOn = signOn;
+    SetTag(SignOnTag());
+    return 1;
 }
 
 OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
@@ -236,10 +278,7 @@ OEParseStatus OEMessageSetBase::PushSyncObject(OETagID tag) {
 OEParseStatus OEMessageSetBase::PushTranObject(OETagID tag) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    // MULTIINTERTRNRQ / RS have a class of their own that is not part of the library yet; the
-    // plain wrapper stands in for it until then.
-    OEDataObj* trans = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(GetMsgSetVersion()))
-                                 : static_cast<OEDataObj*>(factory->NewTransRs(GetMsgSetVersion()));
+    OEDataObj* trans = NewWrapper(factory, m_request, tag, GetMsgSetVersion());
     if (trans) {
         trans->SetType(tag);
         if (m_request)
@@ -297,6 +336,14 @@ int OEMessageSetBase::Build(OEBuilder* builder) {
     if (!t) return OEBS_OK;
     for (const OETagRow& row : t->m_rows) {
         if (row.m_tag == SignOnTag()) continue;
+        if (row.m_tag == OETAG_SECLIST) {
+            int status = m_secList ? m_secList->BuildObject(builder, OETAG_NONE) : OEBS_OK;
+            if (status != OEBS_OK) {
+                builder->SetFailedObject(this);
+                return status;
+            }
+            continue;
+        }
         const OEDataObjList& list = IsSyncTag(row.m_tag) ? m_sync : m_trans;
         for (unsigned short i = 0; i < list.Entries(); ++i) {
             OEDataObj* child = list.Get(i);
@@ -330,8 +377,35 @@ unsigned short OEMessageSetBase::AllRequiredPresent() {
 }
 
 unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
+    if (!other) return 0;
+    if (other == this) return 1;
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
+    if (other->m_signOn) {
+        if (!m_signOn) {
+            m_signOn = NewSignOn(factory, other->m_signOn->GetMsgSetVersion());
+            if (!m_signOn) return 0;
+        }
+        unsigned short ok = m_request ? CopyEntry(static_cast<OESignOnRq*>(m_signOn), other->m_signOn)
+                                      : CopyEntry(static_cast<OESignOnRs*>(m_signOn), other->m_signOn);
+        if (!ok) return 0;
+    } else if (m_signOn) {
+        delete m_signOn;
+        m_signOn = nullptr;
+        // The response's sign-on mark is cleared on both sides, so a request keeps its SONRQ
+        // mark: kept as it is.
+        ClearTag(OETAG_SONRS);
+    }
+    if (other->m_secList) { // response side only
+        if (!m_secList) m_secList = factory->NewSecList(other->m_secList->GetMsgSetVersion());
+        if (!m_secList || !static_cast<OESecList*>(m_secList)->DeepCopyFrom(
+                              static_cast<const OESecList*>(other->m_secList)))
+            return 0;
+    } else if (m_secList) {
+        delete m_secList;
+        m_secList = nullptr;
+        ClearTag(OETAG_SECLIST);
+    }
     // Transactions, then synchronisations: trim, add fresh entries, deep-copy index by index.
     for (int pass = 0; pass < 2; ++pass) {
         OEDataObjList& to = pass == 0 ? m_trans : m_sync;
@@ -343,8 +417,7 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
             unsigned short v = src ? src->GetMsgSetVersion() : 0;
             OEDataObj* fresh;
             if (pass == 0)
-                fresh = m_request ? static_cast<OEDataObj*>(factory->NewTransRq(v))
-                                  : static_cast<OEDataObj*>(factory->NewTransRs(v));
+                fresh = NewWrapper(factory, m_request, src ? src->GetType() : OETAG_NONE, v);
             else
                 fresh = m_request ? static_cast<OEDataObj*>(factory->NewSyncRq(v))
                                   : static_cast<OEDataObj*>(factory->NewSyncRs(v));
@@ -375,53 +448,11 @@ unsigned short OEMessageSetBase::CopyFrom(const OEMessageSetBase* other) {
 
 // ---------------------------------------------------------------- OEMessageSetRq
 
-OEParseStatus OEMessageSetRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRQ) return PushSignOn(entry);
-    const WrapperTables* t = TablesOf(GetType());
-    bool listed = false;
-    if (t)
-        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
-    if (!listed) return OEPS_INVALID;
-    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
-}
-
-unsigned short OEMessageSetRq::SetSignOnRq(OESignOnRq* signOn) {
-    if (m_signOn != signOn) delete m_signOn;
-    if (!signOn) ClearTag(OETAG_SONRQ);
-    m_signOn = signOn;
-    SetTag(OETAG_SONRQ);
-    return 1;
-}
-
 unsigned short OEMessageSetRq::DisconnectSignOnRq() {
     if (!m_signOn) return 0;
     m_signOn = nullptr;
     ClearTag(OETAG_SONRQ);
     return 1;
-}
-
-unsigned short OEMessageSetRq::DeepCopyFrom(const OEMessageSetRq* other) {
-    if (!other) return 0;
-    if (other == this) return 1;
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    if (other->m_signOn) {
-        if (!m_signOn) {
-            m_signOn = factory->NewSignOnRq(other->m_signOn->GetMsgSetVersion());
-            if (!m_signOn) return 0;
-        }
-        if (!static_cast<OESignOnRq*>(m_signOn)->DeepCopyFrom(
-                static_cast<const OESignOnRq*>(other->m_signOn)))
-            return 0;
-    } else if (m_signOn) {
-        delete m_signOn;
-        m_signOn = nullptr;
-        // The response's sign-on tag is cleared here, not SONRQ: kept as it is.
-        ClearTag(OETAG_SONRS);
-    }
-    return CopyFrom(other);
 }
 
 OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
@@ -493,45 +524,13 @@ OETagID OEMessageSetRq::MsgIDToMsgSetID(OETagID tag) {
 
 // ---------------------------------------------------------------- OEMessageSetRs
 
-OEParseStatus OEMessageSetRs::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OETagID tag = entry->m_id;
-    if (tag == OETAG_SONRS) return PushSignOn(entry);
-    const WrapperTables* t = TablesOf(GetType());
-    bool listed = false;
-    if (t)
-        for (const OETagRow& r : t->m_rows) listed = listed || r.m_tag == tag;
-    if (!listed) return OEPS_INVALID;
-    return IsSyncTag(tag) ? PushSyncObject(tag) : PushTranObject(tag);
-}
-
-unsigned short OEMessageSetRs::SetSignOnRs(OESignOnRs* signOn) {
-    if (m_signOn != signOn) delete m_signOn;
-    if (!signOn) ClearTag(OETAG_SONRS);
-    m_signOn = signOn;
-    SetTag(OETAG_SONRS);
+unsigned short OEMessageSetRs::SetSecList(OESecList* list) {
+    if (!IsValidTag(OETAG_SECLIST)) return 0;
+    if (m_secList != list) delete m_secList;
+    if (!list) ClearTag(OETAG_SECLIST);
+    m_secList = list;
+    SetTag(OETAG_SECLIST);
     return 1;
-}
-
-unsigned short OEMessageSetRs::DeepCopyFrom(const OEMessageSetRs* other) {
-    if (!other) return 0;
-    if (other == this) return 1;
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    if (other->m_signOn) {
-        if (!m_signOn) {
-            m_signOn = factory->NewSignOnRs(other->m_signOn->GetMsgSetVersion());
-            if (!m_signOn) return 0;
-        }
-        if (!static_cast<OESignOnRs*>(m_signOn)->DeepCopyFrom(
-                static_cast<const OESignOnRs*>(other->m_signOn)))
-            return 0;
-    } else if (m_signOn) {
-        delete m_signOn;
-        m_signOn = nullptr;
-        ClearTag(OETAG_SONRS);
-    }
-    return CopyFrom(other);
 }
 
 // ================================================================ roots
@@ -560,9 +559,15 @@ unsigned short OERootBase::GetArrayOfValidTags(OEArrayOfTags& tags) const {
     return 1;
 }
 
+// Any wrapper of the valid list is accepted, V1 or V2, whatever version the root was made with:
+// a set's version comes from its own tag, so a V1 sign-on set and a V2 bank set may share a body.
 OEParseStatus OERootBase::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry || !IsValidTag(entry->m_id)) return OEPS_INVALID;
-    return PushMsgObject(entry->m_id);
+    if (!entry) return OEPS_INVALID;
+    OEArrayOfTags valid;
+    GetArrayOfValidTags(valid);
+    for (unsigned short i = 0; i < valid.m_count; ++i)
+        if (valid.m_rows[i].m_tag == entry->m_id) return PushMsgObject(entry->m_id);
+    return OEPS_INVALID;
 }
 
 OEParseStatus OERootBase::PushMsgObject(OETagID tag) {

@@ -2,8 +2,7 @@
 
 namespace {
 
-const char* const kOFXSec[] = {"NONE", "TYPE1"};
-const char* const kSyncMode[] = {"FULL", "LITE"};
+const char* const kPwType[] = {"FIXED", "ONETIME", "HWTOKEN"};
 
 const OETagRow kCoreValid[] = {{OETAG_VER, OEVM_ALL, 0},
                                {OETAG_URL, OEVM_V1, 0},
@@ -59,7 +58,6 @@ const OETagRow kProfileValid[] = {
     {OETAG_PROFMSGSETV1, OEVM_ALL, 0},       {OETAG_PROFMSGSETV2, OEVM_NOTV1, 0},
     {OETAG_SIGNONMSGSETV1, OEVM_ALL, 0},     {OETAG_SIGNONMSGSETV2, OEVM_NOTV1, 0},
 };
-const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
 const OEFieldRow kProfileFields[] = {
     {OETAG_SIGNUPMSGSETV1, OEFK_CHILD, OE_MEMBER(OEMessageSetProfile, m_versions[0]), nullptr,
      OE_MAKE(NewMessageSetVersion)},
@@ -142,20 +140,98 @@ const OEFieldRow kListFields[] = {
 
 const OEAggregateDesc kCoreDesc = OE_DESC(OETAG_MSGSETCORE, kCoreValid, kCoreRequired, kCoreFields);
 const OEAggregateDesc kVersionDesc = OE_DESC(OETAG_NONE, kVersionValid, kVersionValid, kVersionFields);
-const OEAggregateDesc kProfileDesc = {
-    OETAG_NONE,
-    kProfileValid,
-    static_cast<unsigned short>(sizeof(kProfileValid) / sizeof(kProfileValid[0])),
-    kNoRows,
-    0,
-    kProfileFields,
-    static_cast<unsigned short>(sizeof(kProfileFields) / sizeof(kProfileFields[0]))};
+const OEAggregateDesc kProfileDesc = OE_DESC_NO_REQUIRED(OETAG_NONE, kProfileValid, kProfileFields);
 const OEAggregateDesc kListDesc = OE_DESC(OETAG_MSGSETLIST, kListValid, kListRequired, kListFields);
+
+// ---- SIGNONINFO / SIGNONINFOLIST ----
+const OETagRow kInfoValid[] = {
+    {OETAG_SIGNONREALM, OEVM_ALL, 0}, {OETAG_MIN, OEVM_ALL, 0},         {OETAG_MAX, OEVM_ALL, 0},
+    {OETAG_CHARTYPE, OEVM_ALL, 0},    {OETAG_CASESEN, OEVM_ALL, 0},     {OETAG_SPECIAL, OEVM_ALL, 0},
+    {OETAG_SPACES, OEVM_ALL, 0},      {OETAG_PINCH, OEVM_ALL, 0},       {OETAG_CHGPINFIRST, OEVM_ALL, 0},
+    {OETAG_PWTYPE, OEVM_NOTV1, 0},    {OETAG_CLIENTUIDREQ, OEVM_ALL, 0}};
+const OETagRow kInfoRequired[] = {{OETAG_SIGNONREALM, OEVM_ALL, 0}, {OETAG_MIN, OEVM_ALL, 0},
+                                  {OETAG_MAX, OEVM_ALL, 0},         {OETAG_CHARTYPE, OEVM_ALL, 0},
+                                  {OETAG_CASESEN, OEVM_ALL, 0},     {OETAG_SPECIAL, OEVM_ALL, 0},
+                                  {OETAG_SPACES, OEVM_ALL, 0},      {OETAG_PINCH, OEVM_ALL, 0}};
+const OEFieldRow kInfoFields[] = {
+    {OETAG_SIGNONREALM, OEFK_TEXT, OE_MEMBER(OESignOnInfo, m_signOnRealm), nullptr, nullptr},
+    {OETAG_MIN, OEFK_USHORT, OE_MEMBER(OESignOnInfo, m_min), nullptr, nullptr},
+    {OETAG_MAX, OEFK_USHORT, OE_MEMBER(OESignOnInfo, m_max), nullptr, nullptr},
+    {OETAG_CHARTYPE, OEFK_ENUM, OE_MEMBER(OESignOnInfo, m_charType), &OEKW_CHARTYPE, nullptr},
+    {OETAG_CASESEN, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_caseSen), nullptr, nullptr},
+    {OETAG_SPECIAL, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_special), nullptr, nullptr},
+    {OETAG_SPACES, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_spaces), nullptr, nullptr},
+    {OETAG_PINCH, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_pinCh), nullptr, nullptr},
+    {OETAG_CHGPINFIRST, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_chgPinFirst), nullptr, nullptr},
+    {OETAG_PWTYPE, OEFK_ENUM, OE_MEMBER(OESignOnInfo, m_pwType), &OEKW_PWTYPE, nullptr},
+    {OETAG_CLIENTUIDREQ, OEFK_BOOL, OE_MEMBER(OESignOnInfo, m_clientUidReq), nullptr, nullptr},
+};
+const OETagRow kInfoListValid[] = {{OETAG_SIGNONINFO, OEVM_ALL, 0}};
+const OEFieldRow kInfoListFields[] = {
+    {OETAG_SIGNONINFO, OEFK_LIST, OE_MEMBER(OESignOnInfoList, m_infos), nullptr, OE_MAKE(NewSignOnInfo)},
+};
+
+// ---- PROFRQ / PROFRS ----
+const OETagRow kProfRqValid[] = {{OETAG_CLIENTROUTING, OEVM_ALL, 0}, {OETAG_DTPROFUP, OEVM_ALL, 0}};
+const OEFieldRow kProfRqFields[] = {
+    {OETAG_CLIENTROUTING, OEFK_ENUM, OE_MEMBER(OEProfileRq, m_clientRouting), &OEKW_CLIENTROUTING, nullptr},
+    {OETAG_DTPROFUP, OEFK_DATETIME, OE_MEMBER(OEProfileRq, m_dtProfUp), nullptr, nullptr},
+};
+const OETagRow kProfRsValid[] = {{OETAG_MSGSETLIST, OEVM_ALL, 0},
+                                 {OETAG_SIGNONINFOLIST, OEVM_ALL, 0},
+                                 {OETAG_DTPROFUP, OEVM_ALL, 0},
+                                 {OETAG_FINAME, OEVM_ALL, 0},
+                                 {OETAG_ADDR1, OEVM_ALL, 0},
+                                 {OETAG_ADDR2, OEVM_ALL, 0},
+                                 {OETAG_ADDR3, OEVM_ALL, 0},
+                                 {OETAG_CITY, OEVM_ALL, 0},
+                                 {OETAG_STATE, OEVM_ALL, 0},
+                                 {OETAG_POSTALCODE, OEVM_ALL, 0},
+                                 {OETAG_COUNTRY, OEVM_ALL, 0},
+                                 {OETAG_CSPHONE, OEVM_ALL, 0},
+                                 {OETAG_TSPHONE, OEVM_ALL, 0},
+                                 {OETAG_FAXPHONE, OEVM_ALL, 0},
+                                 {OETAG_URL, OEVM_V1, 0},
+                                 {OETAG_URL2, OEVM_NOTV1, 0},
+                                 {OETAG_URLGETREDIRECT, OEVM_NOTV1, 0},
+                                 {OETAG_EMAIL, OEVM_ALL, 0}};
+const OETagRow kProfRsRequired[] = {
+    {OETAG_MSGSETLIST, OEVM_ALL, 0}, {OETAG_SIGNONINFOLIST, OEVM_ALL, 0}, {OETAG_DTPROFUP, OEVM_ALL, 0},
+    {OETAG_FINAME, OEVM_ALL, 0},     {OETAG_ADDR1, OEVM_ALL, 0},          {OETAG_CITY, OEVM_ALL, 0},
+    {OETAG_STATE, OEVM_ALL, 0},      {OETAG_POSTALCODE, OEVM_ALL, 0},     {OETAG_COUNTRY, OEVM_ALL, 0}};
+const OEFieldRow kProfRsFields[] = {
+    {OETAG_MSGSETLIST, OEFK_CHILD, OE_MEMBER(OEProfileRs, m_msgSetList), nullptr, OE_MAKE(NewMessageSetList)},
+    {OETAG_SIGNONINFOLIST, OEFK_CHILD, OE_MEMBER(OEProfileRs, m_signOnInfoList), nullptr,
+     OE_MAKE(NewSignOnInfoList)},
+    {OETAG_DTPROFUP, OEFK_DATETIME, OE_MEMBER(OEProfileRs, m_dtProfUp), nullptr, nullptr},
+    {OETAG_FINAME, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_fiName), nullptr, nullptr},
+    {OETAG_ADDR1, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_addr1), nullptr, nullptr},
+    {OETAG_ADDR2, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_addr2), nullptr, nullptr},
+    {OETAG_ADDR3, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_addr3), nullptr, nullptr},
+    {OETAG_CITY, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_city), nullptr, nullptr},
+    {OETAG_STATE, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_state), nullptr, nullptr},
+    {OETAG_POSTALCODE, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_postalCode), nullptr, nullptr},
+    {OETAG_COUNTRY, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_country), nullptr, nullptr},
+    {OETAG_CSPHONE, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_csPhone), nullptr, nullptr},
+    {OETAG_TSPHONE, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_tsPhone), nullptr, nullptr},
+    {OETAG_FAXPHONE, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_faxPhone), nullptr, nullptr},
+    {OETAG_URL, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_url), nullptr, nullptr},
+    {OETAG_URL2, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_url2), nullptr, nullptr},
+    {OETAG_URLGETREDIRECT, OEFK_BOOL, OE_MEMBER(OEProfileRs, m_urlGetRedirect), nullptr, nullptr},
+    {OETAG_EMAIL, OEFK_TEXT, OE_MEMBER(OEProfileRs, m_email), nullptr, nullptr},
+};
+
+const OEAggregateDesc kInfoDesc = OE_DESC(OETAG_SIGNONINFO, kInfoValid, kInfoRequired, kInfoFields);
+// An empty list of realms is complete: the list row is valid, nothing is required.
+const OEAggregateDesc kInfoListDesc =
+    OE_DESC_NO_REQUIRED(OETAG_SIGNONINFOLIST, kInfoListValid, kInfoListFields);
+// Both elements of the request are required: the valid rows serve as the required ones.
+const OEAggregateDesc kProfRqDesc = OE_DESC(OETAG_PROFRQ, kProfRqValid, kProfRqValid, kProfRqFields);
+const OEAggregateDesc kProfRsDesc = OE_DESC(OETAG_PROFRS, kProfRsValid, kProfRsRequired, kProfRsFields);
 
 } // namespace
 
-const OEKeywordTable OEKW_OFXSECURITY = {kOFXSec, 2};
-const OEKeywordTable OEKW_SYNCMODE = {kSyncMode, 2};
+const OEKeywordTable OEKW_PWTYPE = {kPwType, 3};
 
 OEMessageSetCore::OEMessageSetCore(unsigned short version) : OEAggregate(version) {
     SetType(OETAG_MSGSETCORE);
@@ -181,7 +257,10 @@ OEMessageSetVersion* OEMessageSetProfile::NewMsgSetVersion(OETagID tag, unsigned
     OEMessageSetVersion* v = factory->NewMessageSetVersion(version);
     if (!v) return nullptr;
     v->SetType(tag);
-    if (!SetChildObj(tag, v)) return nullptr;
+    if (!SetChildObj(tag, v)) {
+        delete v;
+        return nullptr;
+    }
     return v;
 }
 
@@ -190,4 +269,37 @@ OEMessageSetList::OEMessageSetList(unsigned short version) : OEAggregate(version
 }
 const OEAggregateDesc& OEMessageSetList::Describe() const {
     return kListDesc;
+}
+
+OESignOnInfo::OESignOnInfo(unsigned short version) : OEAggregate(version) {
+    SetType(OETAG_SIGNONINFO);
+}
+const OEAggregateDesc& OESignOnInfo::Describe() const {
+    return kInfoDesc;
+}
+
+OESignOnInfoList::OESignOnInfoList(unsigned short version) : OEAggregate(version), m_infos(1, 4) {
+    SetType(OETAG_SIGNONINFOLIST);
+}
+const OEAggregateDesc& OESignOnInfoList::Describe() const {
+    return kInfoListDesc;
+}
+
+OEProfileRq::OEProfileRq(unsigned short version) : OETransBase(version) {
+    SetType(OETAG_PROFRQ);
+}
+const OEAggregateDesc& OEProfileRq::Describe() const {
+    return kProfRqDesc;
+}
+
+OEProfileRs::OEProfileRs(unsigned short version) : OETransBase(version) {
+    SetType(OETAG_PROFRS);
+}
+const OEAggregateDesc& OEProfileRs::Describe() const {
+    return kProfRsDesc;
+}
+
+unsigned short OEProfileRs::AllRequiredPresent() {
+    if (!OEAggregate::AllRequiredPresent()) return 0;
+    return ValidateTag(OETAG_ADDR3) && !ValidateTag(OETAG_ADDR2) ? 0 : 1;
 }

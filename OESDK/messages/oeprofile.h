@@ -1,11 +1,11 @@
-// The message-set part of a profile response: MSGSETLIST, the per-message-set aggregates
-// (BANKMSGSET ...), their versions (BANKMSGSETV1 ...) and MSGSETCORE.
+// The profile request and response (PROFRQ, PROFRS) and what a profile response describes: the
+// message sets (MSGSETLIST, the per-message-set aggregates BANKMSGSET ..., their versions
+// BANKMSGSETV1 ... and MSGSETCORE) and the sign-on realms (SIGNONINFOLIST, SIGNONINFO).
 #ifndef OESDK_MESSAGES_OEPROFILE_H
 #define OESDK_MESSAGES_OEPROFILE_H
-#include "messages/oeaggregate.h"
+#include "messages/oetrans.h"
 
-extern OE_API const OEKeywordTable OEKW_OFXSECURITY; // "NONE", "TYPE1"
-extern OE_API const OEKeywordTable OEKW_SYNCMODE;    // "FULL", "LITE"
+extern OE_API const OEKeywordTable OEKW_PWTYPE; // "FIXED", "ONETIME", "HWTOKEN"
 
 // MSGSETCORE.
 class OE_API OEMessageSetCore : public OEAggregate {
@@ -105,6 +105,158 @@ public:
     }
 
     OEOwnedChild m_sets[kSets];
+};
+
+// SIGNONINFO: the password rules of one sign-on realm.
+class OE_API OESignOnInfo : public OEAggregate {
+public:
+    explicit OESignOnInfo(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    const OEString* GetSignOnRealm() const { return GetText(OETAG_SIGNONREALM); }
+    unsigned short SetSignOnRealm(const OEString& v) { return SetFromText(OETAG_SIGNONREALM, v); }
+    unsigned short GetMin() const { return static_cast<unsigned short>(GetNumber(OETAG_MIN)); }
+    unsigned short SetMin(const OEString& v) { return SetFromText(OETAG_MIN, v); }
+    unsigned short SetMin(unsigned short v) { return SetNumber(OETAG_MIN, v); }
+    unsigned short GetMax() const { return static_cast<unsigned short>(GetNumber(OETAG_MAX)); }
+    unsigned short SetMax(const OEString& v) { return SetFromText(OETAG_MAX, v); }
+    unsigned short SetMax(unsigned short v) { return SetNumber(OETAG_MAX, v); }
+    // CHARTYPE as an index of OEKW_CHARTYPE (the order of OECharacterType).
+    unsigned short GetCharType() const { return static_cast<unsigned short>(GetNumber(OETAG_CHARTYPE)); }
+    unsigned short SetCharType(const OEString& v) { return SetFromText(OETAG_CHARTYPE, v); }
+    unsigned short SetCharType(unsigned short v) { return SetNumber(OETAG_CHARTYPE, v); }
+    unsigned short GetCaseSensitive() const { return static_cast<unsigned short>(GetNumber(OETAG_CASESEN)); }
+    unsigned short SetCaseSensitive(const OEString& v) { return SetFromText(OETAG_CASESEN, v); }
+    unsigned short SetCaseSensitive(unsigned short v) { return SetNumber(OETAG_CASESEN, v); }
+    unsigned short GetSpecial() const { return static_cast<unsigned short>(GetNumber(OETAG_SPECIAL)); }
+    unsigned short SetSpecial(const OEString& v) { return SetFromText(OETAG_SPECIAL, v); }
+    unsigned short SetSpecial(unsigned short v) { return SetNumber(OETAG_SPECIAL, v); }
+    unsigned short GetSpaces() const { return static_cast<unsigned short>(GetNumber(OETAG_SPACES)); }
+    unsigned short SetSpaces(const OEString& v) { return SetFromText(OETAG_SPACES, v); }
+    unsigned short SetSpaces(unsigned short v) { return SetNumber(OETAG_SPACES, v); }
+    unsigned short GetPinChange() const { return static_cast<unsigned short>(GetNumber(OETAG_PINCH)); }
+    unsigned short SetPinChange(const OEString& v) { return SetFromText(OETAG_PINCH, v); }
+    unsigned short SetPinChange(unsigned short v) { return SetNumber(OETAG_PINCH, v); }
+    unsigned short GetChangePinFirst() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_CHGPINFIRST));
+    }
+    unsigned short SetChangePinFirst(const OEString& v) { return SetFromText(OETAG_CHGPINFIRST, v); }
+    unsigned short SetChangePinFirst(unsigned short v) { return SetNumber(OETAG_CHGPINFIRST, v); }
+    // PWTYPE (every version but 1) as an index of OEKW_PWTYPE.
+    unsigned short GetPasswordType() const { return static_cast<unsigned short>(GetNumber(OETAG_PWTYPE)); }
+    unsigned short SetPasswordType(const OEString& v) { return SetFromText(OETAG_PWTYPE, v); }
+    unsigned short SetPasswordType(unsigned short v) { return SetNumber(OETAG_PWTYPE, v); }
+    unsigned short GetClientUIdRequired() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_CLIENTUIDREQ));
+    }
+    unsigned short SetClientUIdRequired(const OEString& v) { return SetFromText(OETAG_CLIENTUIDREQ, v); }
+    unsigned short SetClientUIdRequired(unsigned short v) { return SetNumber(OETAG_CLIENTUIDREQ, v); }
+
+    OEString32 m_signOnRealm;
+    unsigned short m_min = 0, m_max = 0, m_charType = 0, m_caseSen = 0, m_special = 0, m_spaces = 0;
+    unsigned short m_pinCh = 0, m_chgPinFirst = 0, m_pwType = 0, m_clientUidReq = 0;
+};
+
+// SIGNONINFOLIST: the sign-on realms in order.
+class OE_API OESignOnInfoList : public OEAggregate {
+public:
+    explicit OESignOnInfoList(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    unsigned short AppendSignOnInfo(OESignOnInfo* info) { return AppendToList(OETAG_SIGNONINFO, info); }
+    OESignOnInfo* GetSignOnInfo(unsigned short index) const {
+        return static_cast<OESignOnInfo*>(m_infos.Get(index));
+    }
+    unsigned short GetNumSignOnInfo() const { return m_infos.Entries(); }
+    void DeleteAllSignOnInfo() {
+        m_infos.DeleteAll();
+        ClearTag(OETAG_SIGNONINFO);
+    }
+
+    OEDataObjList m_infos;
+};
+
+// PROFRQ: CLIENTROUTING and DTPROFUP, both required.
+class OE_API OEProfileRq : public OETransBase {
+public:
+    explicit OEProfileRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    // CLIENTROUTING as an index of OEKW_CLIENTROUTING (the order of OEClientRouting).
+    unsigned short GetClientRouting() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_CLIENTROUTING));
+    }
+    unsigned short SetClientRouting(const OEString& v) { return SetFromText(OETAG_CLIENTROUTING, v); }
+    unsigned short SetClientRouting(unsigned short v) { return SetNumber(OETAG_CLIENTROUTING, v); }
+    const OEDateTime* GetDtProfUp() const { return GetDateTime(OETAG_DTPROFUP); }
+    unsigned short SetDtProfUp(const OEString& v) { return SetFromText(OETAG_DTPROFUP, v); }
+    unsigned short SetDtProfUp(const OEDateTime& v) { return SetDateTime(OETAG_DTPROFUP, v); }
+
+    unsigned short m_clientRouting = 0;
+    OEDateTime m_dtProfUp;
+};
+
+// PROFRS: the message sets and sign-on realms the institution offers, and how to reach it.
+class OE_API OEProfileRs : public OETransBase {
+public:
+    explicit OEProfileRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    // The required rows, and ADDR3 only together with ADDR2.
+    unsigned short AllRequiredPresent() override;
+    OEMessageSetList* GetMessageSetList() const {
+        return static_cast<OEMessageSetList*>(GetChildObj(OETAG_MSGSETLIST));
+    }
+    unsigned short SetMessageSetList(OEMessageSetList* l) { return SetChildObj(OETAG_MSGSETLIST, l); }
+    OESignOnInfoList* GetSignOnInfoList() const {
+        return static_cast<OESignOnInfoList*>(GetChildObj(OETAG_SIGNONINFOLIST));
+    }
+    unsigned short SetSignOnInfoList(OESignOnInfoList* l) { return SetChildObj(OETAG_SIGNONINFOLIST, l); }
+    const OEDateTime* GetDtProfUp() const { return GetDateTime(OETAG_DTPROFUP); }
+    unsigned short SetDtProfUp(const OEString& v) { return SetFromText(OETAG_DTPROFUP, v); }
+    unsigned short SetDtProfUp(const OEDateTime& v) { return SetDateTime(OETAG_DTPROFUP, v); }
+    const OEString* GetFIName() const { return GetText(OETAG_FINAME); }
+    unsigned short SetFIName(const OEString& v) { return SetFromText(OETAG_FINAME, v); }
+    const OEString* GetAddr1() const { return GetText(OETAG_ADDR1); }
+    unsigned short SetAddr1(const OEString& v) { return SetFromText(OETAG_ADDR1, v); }
+    const OEString* GetAddr2() const { return GetText(OETAG_ADDR2); }
+    unsigned short SetAddr2(const OEString& v) { return SetFromText(OETAG_ADDR2, v); }
+    const OEString* GetAddr3() const { return GetText(OETAG_ADDR3); }
+    unsigned short SetAddr3(const OEString& v) { return SetFromText(OETAG_ADDR3, v); }
+    const OEString* GetCity() const { return GetText(OETAG_CITY); }
+    unsigned short SetCity(const OEString& v) { return SetFromText(OETAG_CITY, v); }
+    const OEString* GetState() const { return GetText(OETAG_STATE); }
+    unsigned short SetState(const OEString& v) { return SetFromText(OETAG_STATE, v); }
+    const OEString* GetPostalCode() const { return GetText(OETAG_POSTALCODE); }
+    unsigned short SetPostalCode(const OEString& v) { return SetFromText(OETAG_POSTALCODE, v); }
+    const OEString* GetCountry() const { return GetText(OETAG_COUNTRY); }
+    unsigned short SetCountry(const OEString& v) { return SetFromText(OETAG_COUNTRY, v); }
+    const OEString* GetCustomerServicePhone() const { return GetText(OETAG_CSPHONE); }
+    unsigned short SetCustomerServicePhone(const OEString& v) { return SetFromText(OETAG_CSPHONE, v); }
+    const OEString* GetTechnicalSupportPhone() const { return GetText(OETAG_TSPHONE); }
+    unsigned short SetTechnicalSupportPhone(const OEString& v) { return SetFromText(OETAG_TSPHONE, v); }
+    const OEString* GetFaxPhone() const { return GetText(OETAG_FAXPHONE); }
+    unsigned short SetFaxPhone(const OEString& v) { return SetFromText(OETAG_FAXPHONE, v); }
+    // URL in version 1, URL2 and URLGETREDIRECT in the later versions.
+    const OEString* GetURL() const { return GetText(OETAG_URL); }
+    unsigned short SetURL(const OEString& v) { return SetFromText(OETAG_URL, v); }
+    const OEString* GetURL2() const { return GetText(OETAG_URL2); }
+    unsigned short SetURL2(const OEString& v) { return SetFromText(OETAG_URL2, v); }
+    unsigned short GetURLGetRedirect() const {
+        return static_cast<unsigned short>(GetNumber(OETAG_URLGETREDIRECT));
+    }
+    unsigned short SetURLGetRedirect(const OEString& v) { return SetFromText(OETAG_URLGETREDIRECT, v); }
+    unsigned short SetURLGetRedirect(unsigned short v) { return SetNumber(OETAG_URLGETREDIRECT, v); }
+    const OEString* GetEMail() const { return GetText(OETAG_EMAIL); }
+    unsigned short SetEMail(const OEString& v) { return SetFromText(OETAG_EMAIL, v); }
+
+    OEOwnedChild m_msgSetList, m_signOnInfoList;
+    OEDateTime m_dtProfUp;
+    OEString32 m_fiName, m_addr1, m_addr2, m_addr3, m_city;
+    OEBoundedString<5> m_state;
+    OEBoundedString<11> m_postalCode;
+    OEString3 m_country;
+    OEString32 m_csPhone, m_tsPhone, m_faxPhone;
+    OEString255 m_url;
+    OEBoundedString<1024> m_url2;
+    unsigned short m_urlGetRedirect = 0;
+    OEBoundedString<80> m_email;
 };
 
 #endif

@@ -5,6 +5,10 @@
 #include "foundation/oethread.h"
 #include "messages/oeaccount.h"
 #include "messages/oebank.h"
+#include "messages/oechallenge.h"
+#include "messages/oeprofile.h"
+#include "messages/oestmtend.h"
+#include "messages/oeseclist.h"
 #include "messages/oesignon.h"
 
 #include <cstdlib>
@@ -122,9 +126,19 @@ const RequiredInner* FindRequiredInner(OETagID wrapper) {
     return nullptr;
 }
 
+// The required inner aggregates of a wrapper present: the one tag, or the exclusive or of the two
+// or three (of their responses on the response side).
+unsigned short RequiredInnerPresent(const OEDataObj& wrapper, const RequiredInner& r, bool response) {
+    auto present = [&](OETagID tag) { return wrapper.ValidateTag(response ? OEResponseTagOf(tag) : tag); };
+    if (r.m_b == OETAG_NONE) return present(r.m_a);
+    unsigned short x = present(r.m_a) ^ present(r.m_b);
+    if (r.m_c != OETAG_NONE) x ^= present(r.m_c);
+    return x;
+}
+
 // ---- transaction request wrapper ----
 // Valid rows: the four elements, then all 52 inner requests (built once, below). An inner request
-// whose class is not part of the library yet has no field row: NewRq answers 4 for it.
+// whose class is not part of the library yet has no field row: NewInner answers 4 for it.
 const OETagRow kTransRqRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}};
 const OEFieldRow kTransRqFields[] = {
     {OETAG_TRNUID, OEFK_TEXT, OE_MEMBER(OETransRq, m_trnUid), nullptr, nullptr},
@@ -134,6 +148,11 @@ const OEFieldRow kTransRqFields[] = {
     {OETAG_STMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewBankStatementRq)},
     {OETAG_CCSTMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementRq)},
     {OETAG_PINCHRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewPinChangeRq)},
+    {OETAG_STMTENDRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewStatementEndRq)},
+    {OETAG_CCSTMTENDRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewCCStatementEndRq)},
+    {OETAG_CHALLENGERQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewChallengeRq)},
+    {OETAG_PROFRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewProfileRq)},
+    {OETAG_SECLISTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewSecListRq)},
 };
 
 // ---- transaction response wrapper ----
@@ -147,11 +166,14 @@ const OEFieldRow kTransRsFields[] = {
     {OETAG_STMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewBankStatementRs)},
     {OETAG_CCSTMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementRs)},
     {OETAG_PINCHRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewPinChangeRs)},
+    {OETAG_STMTENDRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewStatementEndRs)},
+    {OETAG_CCSTMTENDRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewCCStatementEndRs)},
+    {OETAG_CHALLENGERS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewChallengeRs)},
+    {OETAG_PROFRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewProfileRs)},
+    {OETAG_SECLISTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewSecListRs)},
 };
 
 // ---- STATUS ----
-const char* const kSeverity[] = {"INFO", "WARN", "ERROR"};
-const OEKeywordTable kSeverityTable = {kSeverity, 3};
 const OETagRow kStatusValid[] = {{OETAG_CODE, OEVM_ALL, 0},
                                  {OETAG_SEVERITY, OEVM_ALL, 0},
                                  {OETAG_MESSAGE, OEVM_V1, 0},
@@ -159,7 +181,7 @@ const OETagRow kStatusValid[] = {{OETAG_CODE, OEVM_ALL, 0},
 const OETagRow kStatusRequired[] = {{OETAG_CODE, OEVM_ALL, 0}, {OETAG_SEVERITY, OEVM_ALL, 0}};
 const OEFieldRow kStatusFields[] = {
     {OETAG_CODE, OEFK_SLONG, OE_MEMBER(OEStatus, m_code), nullptr, nullptr},
-    {OETAG_SEVERITY, OEFK_ENUM, OE_MEMBER(OEStatus, m_severity), &kSeverityTable, nullptr},
+    {OETAG_SEVERITY, OEFK_ENUM, OE_MEMBER(OEStatus, m_severity), &OEKW_SEVERITY, nullptr},
     {OETAG_MESSAGE, OEFK_TEXT, OE_MEMBER(OEStatus, m_message), nullptr, nullptr},
     {OETAG_MESSAGE2, OEFK_TEXT, OE_MEMBER(OEStatus, m_message2), nullptr, nullptr},
 };
@@ -229,7 +251,6 @@ const OETagRow kSyncRsValid[] = {{OETAG_TOKEN, OEVM_ALL, 0},
                                  {OETAG_K_EMPNEXTID, OEVM_ALL, 0},
                                  {OETAG_K_PITEMNEXTID, OEVM_ALL, 0},
                                  OE_SYNC_WRAPPER_ROWS(RS)};
-const OETagRow kNoRows[] = {{OETAG_NONE, 0, 0}};
 const OEFieldRow kSyncRsFields[] = {
     {OETAG_TOKEN, OEFK_TEXT, OE_MEMBER(OESyncRs, m_token), nullptr, nullptr},
     {OETAG_TOKEN2, OEFK_TEXT, OE_MEMBER(OESyncRs, m_token2), nullptr, nullptr},
@@ -280,18 +301,77 @@ const OEAggregateDesc& TransRsDesc() {
     static const OEAggregateDesc desc = WrapperDesc(valid, kTransRsRequired, kTransRsFields);
     return desc;
 }
+
+// ---- MULTIINTERTRNRQ / MULTIINTERTRNRS ----
+// A multiple wrapper has the plain wrapper's first rows (its elements, and STATUS and WARNING on
+// the response side), then a list of inner aggregates made by the plain wrapper's creator for
+// that tag. So INTERRQ / INTERRS become available here the moment the plain wrapper gets a row
+// for them.
+const unsigned short kWrapperOwnRows = 4;
+static_assert(sizeof(kTransRqFields) / sizeof(kTransRqFields[0]) >= kWrapperOwnRows, "own rows");
+static_assert(sizeof(kTransRsFields) / sizeof(kTransRsFields[0]) >= kWrapperOwnRows, "own rows");
+
+template <size_t N> const OEFieldRow* InnerRowOf(const OEFieldRow (&rows)[N], OETagID tag) {
+    for (const OEFieldRow& r : rows)
+        if (r.m_tag == tag && r.m_kind == OEFK_CHILD) return &r;
+    return nullptr;
+}
+
+OEDataObj* MakeInterRq(OEDataObjFactory* factory, unsigned short version) {
+    const OEFieldRow* row = InnerRowOf(kTransRqFields, OETAG_INTERRQ);
+    return row ? row->m_make(factory, version) : nullptr;
+}
+OEDataObj* MakeInterRs(OEDataObjFactory* factory, unsigned short version) {
+    const OEFieldRow* row = InnerRowOf(kTransRsFields, OETAG_INTERRS);
+    return row ? row->m_make(factory, version) : nullptr;
+}
+
+// The rows of a multiple wrapper: `own` (the plain wrapper's first rows), then `list`.
+struct MultiTables {
+    std::vector<OEFieldRow> m_fields;
+    std::vector<OETagRow> m_valid;
+    MultiTables(const OEFieldRow* own, const OEFieldRow& list) : m_fields(own, own + kWrapperOwnRows) {
+        m_fields.push_back(list);
+        for (const OEFieldRow& r : m_fields) m_valid.push_back(OETagRow{r.m_tag, OEVM_ALL, 0});
+    }
+};
+
+const OETagRow kMultiRqRequired[] = {{OETAG_TRNUID, OEVM_ALL, 0}, {OETAG_INTERRQ, OEVM_ALL, 0}};
+
+const OEAggregateDesc& MultiRqDesc() {
+    static const MultiTables t(
+        kTransRqFields,
+        OEFieldRow{OETAG_INTERRQ, OEFK_LIST, OE_MEMBER(OEMultiTransRq, m_inter), nullptr, MakeInterRq});
+    static const OEAggregateDesc desc{OETAG_MULTIINTERTRNRQ,
+                                      t.m_valid.data(),
+                                      static_cast<unsigned short>(t.m_valid.size()),
+                                      kMultiRqRequired,
+                                      2,
+                                      t.m_fields.data(),
+                                      static_cast<unsigned short>(t.m_fields.size())};
+    return desc;
+}
+
+const OEAggregateDesc& MultiRsDesc() {
+    static const MultiTables t(
+        kTransRsFields,
+        OEFieldRow{OETAG_INTERRS, OEFK_LIST, OE_MEMBER(OEMultiTransRs, m_inter), nullptr, MakeInterRs});
+    static const OEAggregateDesc desc{
+        OETAG_MULTIINTERTRNRS,
+        t.m_valid.data(),
+        static_cast<unsigned short>(t.m_valid.size()),
+        kTransRsRequired,
+        static_cast<unsigned short>(sizeof(kTransRsRequired) / sizeof(kTransRsRequired[0])),
+        t.m_fields.data(),
+        static_cast<unsigned short>(t.m_fields.size())};
+    return desc;
+}
+
 const OEAggregateDesc kStatusDesc = OE_DESC(OETAG_STATUS, kStatusValid, kStatusRequired, kStatusFields);
 const OEAggregateDesc kWarningDesc = OE_DESC(OETAG_WARNING, kWarningValid, kWarningValid, kWarningFields);
 const OEAggregateDesc kSyncRqDesc = OE_DESC(OETAG_NONE, kSyncRqValid, kSyncRqRequired, kSyncRqFields);
 // No generic required rows: the token rule below is the whole check.
-const OEAggregateDesc kSyncRsDesc = {
-    OETAG_NONE,
-    kSyncRsValid,
-    static_cast<unsigned short>(sizeof(kSyncRsValid) / sizeof(kSyncRsValid[0])),
-    kNoRows,
-    0,
-    kSyncRsFields,
-    static_cast<unsigned short>(sizeof(kSyncRsFields) / sizeof(kSyncRsFields[0]))};
+const OEAggregateDesc kSyncRsDesc = OE_DESC_NO_REQUIRED(OETAG_NONE, kSyncRsValid, kSyncRsFields);
 
 bool IsSyncWrapper(OETagID tag, bool response) {
     for (OETagID t : kSyncWrappers)
@@ -357,8 +437,8 @@ unsigned short OEStatus::SetCode(long code) {
 }
 
 unsigned short OEStatus::SetSeverity(const OEString& text) {
-    for (unsigned short i = 0; i < 3; ++i) {
-        if (text.strcmpi(kSeverity[i]) == 0) return SetSeverity(static_cast<OEStatusSeverity>(i));
+    for (unsigned short i = 0; i < OEKW_SEVERITY.m_count; ++i) {
+        if (text.strcmpi(OEKW_SEVERITY.m_words[i]) == 0) return SetSeverity(static_cast<OEStatusSeverity>(i));
     }
     // The conversion reports the word first (no tag), then the setter against SEVERITY.
     OELogParseWarning(OEPW_BADFORMAT, text.c_str(), "", OETAG_NONE, this);
@@ -395,31 +475,28 @@ const OEAggregateDesc& OEWarning::Describe() const {
     return kWarningDesc;
 }
 
-// ---------------------------------------------------------------- OETransRq
+// ---------------------------------------------------------------- OETransWrapper
 
-OETransRq::OETransRq(unsigned short version) : OETransBase(version) {}
-const OEAggregateDesc& OETransRq::Describe() const {
-    return TransRqDesc();
+const OEFieldRow* OETransWrapper::FindInnerRow(OETagID tag) const {
+    const OEFieldRow* row = FindRow(tag);
+    return row && row->m_kind == OEFK_CHILD && Slot(row) == &m_actual ? row : nullptr;
 }
 
-OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
-    for (const InnerRow& r : kInner)
-        if (r.m_inner == tag) return r.m_wrapper;
-    return OETAG_NONE;
+unsigned short OETransWrapper::SetActualTrans(OETransBase* inner) {
+    if (inner) return FindInnerRow(inner->GetType()) ? SetChildObj(inner->GetType(), inner) : 0;
+    // Clearing goes through any one of the rows that share the inner slot.
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (FindInnerRow(d.m_fields[i].m_tag)) return SetChildObj(d.m_fields[i].m_tag, nullptr);
+    return 0;
 }
 
-unsigned short OETransRq::SetActualTrans(OETransBase* inner) {
-    if (!inner) return SetChildObj(OETAG_STMTRQ, nullptr);
-    if (!FindRow(inner->GetType())) return 0;
-    return SetChildObj(inner->GetType(), inner);
-}
-
-OEParseStatus OETransRq::NewRq(OETagID tag) {
+OEParseStatus OETransWrapper::NewInner(OETagID tag, OETagID efileTag) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return OEPS_NORESOURCE;
-    if (tag == OETAG_K_EFILERQ) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_CHILD || row->m_tag == OETAG_STATUS) return OEPS_INVALID;
+    if (tag == efileTag) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
+    const OEFieldRow* row = FindInnerRow(tag);
+    if (!row) return OEPS_INVALID;
     OEDataObj* inner = row->m_make(factory, GetMsgSetVersion());
     if (!inner) {
         OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
@@ -430,36 +507,42 @@ OEParseStatus OETransRq::NewRq(OETagID tag) {
     return OEPS_OK;
 }
 
-OEParseStatus OETransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    OEParseStatus status = NewRq(entry->m_id);
+OEParseStatus OETransWrapper::StartInner(const OETagDictionaryEntry* entry, OETagID efileTag) {
+    OEParseStatus status = NewInner(entry->m_id, efileTag);
     if (status != OEPS_OK) return status;
     return PushAndSetObject(m_actual.get(), entry->m_id);
+}
+
+// ---------------------------------------------------------------- OETransRq
+
+OETransRq::OETransRq(unsigned short version) : OETransWrapper(version) {}
+const OEAggregateDesc& OETransRq::Describe() const {
+    return TransRqDesc();
+}
+
+OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
+    for (const InnerRow& r : kInner)
+        if (r.m_inner == tag) return r.m_wrapper;
+    return OETAG_NONE;
+}
+
+OEParseStatus OETransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    return StartInner(entry, OETAG_K_EFILERQ);
 }
 
 unsigned short OETransRq::AllRequiredPresent() {
     if (!m_actual.get() || !ValidateTag(OETAG_TRNUID)) return 0;
     if (GetType() == OETAG_NONE) return 0;
     const RequiredInner* r = FindRequiredInner(GetType());
-    if (!r) return 1;
-    if (r->m_b == OETAG_NONE) return ValidateTag(r->m_a);
-    unsigned short x = ValidateTag(r->m_a) ^ ValidateTag(r->m_b);
-    if (r->m_c != OETAG_NONE) x ^= ValidateTag(r->m_c);
-    return x;
+    return r ? RequiredInnerPresent(*this, *r, false) : 1;
 }
 
 // ---------------------------------------------------------------- OETransRs
 
-OETransRs::OETransRs(unsigned short version) : OETransBase(version) {}
+OETransRs::OETransRs(unsigned short version) : OETransWrapper(version) {}
 const OEAggregateDesc& OETransRs::Describe() const {
     return TransRsDesc();
-}
-
-unsigned short OETransRs::SetActualTrans(OETransBase* inner) {
-    if (!inner) return SetChildObj(OETAG_STMTRS, nullptr);
-    const OEFieldRow* row = FindRow(inner->GetType());
-    if (!row || row->m_tag == OETAG_STATUS || row->m_tag == OETAG_WARNING) return 0;
-    return SetChildObj(inner->GetType(), inner);
 }
 
 OETransBase* OETransRs::DisconnectActualTrans() {
@@ -479,32 +562,13 @@ unsigned short OETransRs::IsUpToDate() const {
     return ValidateTag(OETAG_STATUS) && s && s->ValidateTag(OETAG_CODE) && s->GetCode() == 1;
 }
 
-OEParseStatus OETransRs::NewRs(OETagID tag) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    if (tag == OETAG_K_EFILERS) return m_actual.get() ? OEPS_OK : OEPS_NORESOURCE;
-    const OEFieldRow* row = FindRow(tag);
-    if (!row || row->m_kind != OEFK_CHILD || row->m_tag == OETAG_STATUS || row->m_tag == OETAG_WARNING)
-        return OEPS_INVALID;
-    OEDataObj* inner = row->m_make(factory, GetMsgSetVersion());
-    if (!inner) {
-        OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        return OEPS_NORESOURCE;
-    }
-    inner->SetType(tag);
-    SetChildObj(tag, inner);
-    return OEPS_OK;
-}
-
 OEParseStatus OETransRs::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
     if (entry->m_id == OETAG_STATUS || entry->m_id == OETAG_WARNING) {
         if (!IsValidTag(entry->m_id)) return OEPS_INVALID;
         return StartChild(FindRow(entry->m_id), entry);
     }
-    OEParseStatus status = NewRs(entry->m_id);
-    if (status != OEPS_OK) return status;
-    return PushAndSetObject(m_actual.get(), entry->m_id);
+    return StartInner(entry, OETAG_K_EFILERS);
 }
 
 unsigned short OETransRs::AllRequiredPresent() {
@@ -523,15 +587,126 @@ unsigned short OETransRs::AllRequiredPresent() {
     const RequiredInner* r = FindRequiredInner(rqTag);
     if (!r) return 1;
     if (IsErrorStatus() || IsUpToDate()) return 1;
-    if (r->m_b == OETAG_NONE) return ValidateTag(OEResponseTagOf(r->m_a));
-    unsigned short x = ValidateTag(OEResponseTagOf(r->m_a)) ^ ValidateTag(OEResponseTagOf(r->m_b));
-    if (r->m_c != OETAG_NONE) x ^= ValidateTag(OEResponseTagOf(r->m_c));
-    return x;
+    return RequiredInnerPresent(*this, *r, true);
+}
+
+// ---------------------------------------------------------------- OESyncBase
+
+OESyncBase::OESyncBase(unsigned short version, bool request)
+    : OEAggregate(version), m_trans(1, 5), m_request(request) {}
+
+unsigned short OESyncBase::SetAccount(OEDataObj* account) {
+    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
+    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
+                       account);
+}
+
+unsigned short OESyncBase::StoreTrans(unsigned short index, OETransWrapper* trans, bool append) {
+    if (!trans) return 0;
+    if (append) {
+        if (!m_trans.Append(trans)) return 0;
+    } else if (index > m_trans.Entries() || !m_trans.Set(index, trans)) {
+        return 0;
+    }
+    if (trans->GetType()) SetTag(trans->GetType());
+    return 1;
+}
+
+OEParseStatus OESyncBase::PushTranObject(const OETagDictionaryEntry* entry) {
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return OEPS_NORESOURCE;
+    OETransWrapper* trans = m_request ? static_cast<OETransWrapper*>(factory->NewTransRq(GetMsgSetVersion()))
+                                      : static_cast<OETransWrapper*>(factory->NewTransRs(GetMsgSetVersion()));
+    if (trans) {
+        trans->SetType(entry->m_id);
+        trans->m_msgsTag = m_msgsTag;
+    }
+    return AdoptListChild(this, m_trans, trans, entry->m_id);
+}
+
+OEParseStatus OESyncBase::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry) return OEPS_INVALID;
+    if (IsSyncWrapper(entry->m_id, !m_request)) return PushTranObject(entry);
+    return OEAggregate::HandleTagStart(entry);
+}
+
+int OESyncBase::Build(OEBuilder* builder) {
+    int status = OEAggregate::Build(builder);
+    if (status != OEBS_OK) return status;
+    return BuildEach(this, builder, m_trans);
+}
+
+OEDataObj* OESyncBase::GetChild(unsigned short index) const {
+    unsigned short own = OEAggregate::GetNumberOfChildren();
+    if (index < own) return OEAggregate::GetChild(index);
+    return m_trans.Get(static_cast<unsigned short>(index - own));
+}
+
+unsigned short OESyncBase::GetNumberOfChildren() const {
+    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
+}
+
+// Copies the wrappers (their own tags and children included) through the factory.
+unsigned short OESyncBase::CopyExtraFrom(const OEAggregate* other) {
+    const OESyncBase* src = static_cast<const OESyncBase*>(other);
+    m_msgsTag = src->m_msgsTag;
+    m_trans.DeleteAll();
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return 0;
+    for (unsigned short i = 0; i < src->m_trans.Entries(); ++i) {
+        const OEAggregate* from = static_cast<const OEAggregate*>(src->m_trans.Get(i));
+        if (!from) continue;
+        unsigned short v = from->GetMsgSetVersion();
+        OEAggregate* copy = m_request ? static_cast<OEAggregate*>(factory->NewTransRq(v))
+                                      : static_cast<OEAggregate*>(factory->NewTransRs(v));
+        if (!copy) return 0;
+        if (!m_trans.Append(copy)) {
+            delete copy;
+            return 0;
+        }
+        if (!copy->DeepCopyFrom(from)) return 0;
+    }
+    return 1;
+}
+
+// ---------------------------------------------------------------- OEMultiTransRq / Rs
+
+OEMultiTransRq::OEMultiTransRq(unsigned short version) : OETransRq(version), m_inter(1, 5) {
+    SetType(OETAG_MULTIINTERTRNRQ);
+}
+const OEAggregateDesc& OEMultiTransRq::Describe() const {
+    return MultiRqDesc();
+}
+
+OEParseStatus OEMultiTransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (!entry || entry->m_id != OETAG_INTERRQ || !InnerRowOf(kTransRqFields, OETAG_INTERRQ))
+        return OEPS_INVALID;
+    return OEAggregate::HandleTagStart(entry);
+}
+
+unsigned short OEMultiTransRq::AllRequiredPresent() {
+    return OEAggregate::AllRequiredPresent() && m_inter.Entries() > 0;
+}
+
+OEMultiTransRs::OEMultiTransRs(unsigned short version) : OETransRs(version), m_inter(1, 5) {
+    SetType(OETAG_MULTIINTERTRNRS);
+}
+const OEAggregateDesc& OEMultiTransRs::Describe() const {
+    return MultiRsDesc();
+}
+
+OEParseStatus OEMultiTransRs::HandleTagStart(const OETagDictionaryEntry* entry) {
+    if (entry && entry->m_id == OETAG_INTERRS) {
+        if (!InnerRowOf(kTransRsFields, OETAG_INTERRS)) return OEPS_INVALID;
+        return OEAggregate::HandleTagStart(entry);
+    }
+    // STATUS and WARNING as in the plain wrapper; no other inner response has a row here.
+    return OETransRs::HandleTagStart(entry);
 }
 
 // ---------------------------------------------------------------- OESyncRq
 
-OESyncRq::OESyncRq(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
+OESyncRq::OESyncRq(unsigned short version) : OESyncBase(version, true) {}
 const OEAggregateDesc& OESyncRq::Describe() const {
     return kSyncRqDesc;
 }
@@ -586,48 +761,6 @@ OETagID OESyncRq::MsgIDToSyncWrapper(OETagID tag) {
     }
 }
 
-unsigned short OESyncRq::SetAccount(OEDataObj* account) {
-    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
-                       account);
-}
-
-unsigned short OESyncRq::AppendTrans(OETransRq* trans) {
-    if (!trans || !m_trans.Append(trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-unsigned short OESyncRq::SetTrans(unsigned short index, OETransRq* trans) {
-    if (!trans || index > m_trans.Entries()) return 0;
-    if (!m_trans.Set(index, trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-OEParseStatus OESyncRq::PushTranObject(const OETagDictionaryEntry* entry) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OETransRq* trans = factory->NewTransRq(GetMsgSetVersion());
-    if (trans) {
-        trans->SetType(entry->m_id);
-        trans->SetMsgsRqTag(GetMsgsRqTag());
-    }
-    return AdoptListChild(this, m_trans, trans, entry->m_id);
-}
-
-OEParseStatus OESyncRq::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    if (IsSyncWrapper(entry->m_id, false)) return PushTranObject(entry);
-    return OEAggregate::HandleTagStart(entry);
-}
-
-int OESyncRq::Build(OEBuilder* builder) {
-    int status = OEAggregate::Build(builder);
-    if (status != OEBS_OK) return status;
-    return BuildEach(this, builder, m_trans);
-}
-
 unsigned short OESyncRq::AllRequiredPresent() {
     if (!ValidateTag(OETAG_REJECTIFMISSING)) return 0;
     unsigned short token = ValidateTag(OETAG_TOKEN) ^ ValidateTag(OETAG_TOKEN2);
@@ -656,56 +789,11 @@ unsigned short OESyncRq::AllRequiredPresent() {
     }
 }
 
-OEDataObj* OESyncRq::GetChild(unsigned short index) const {
-    unsigned short own = OEAggregate::GetNumberOfChildren();
-    if (index < own) return OEAggregate::GetChild(index);
-    return m_trans.Get(static_cast<unsigned short>(index - own));
-}
-
-unsigned short OESyncRq::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
-}
-
 // ---------------------------------------------------------------- OESyncRs
 
-OESyncRs::OESyncRs(unsigned short version) : OEAggregate(version), m_trans(1, 5) {}
+OESyncRs::OESyncRs(unsigned short version) : OESyncBase(version, false) {}
 const OEAggregateDesc& OESyncRs::Describe() const {
     return kSyncRsDesc;
-}
-
-unsigned short OESyncRs::SetAccount(OEDataObj* account) {
-    if (!account) return SetChildObj(OETAG_BANKACCTFROM, nullptr);
-    return SetChildObj(account->GetType() == OETAG_CCACCTFROM ? OETAG_CCACCTFROM : OETAG_BANKACCTFROM,
-                       account);
-}
-
-unsigned short OESyncRs::AppendTrans(OETransRs* trans) {
-    if (!trans || !m_trans.Append(trans)) return 0;
-    if (trans->GetType()) SetTag(trans->GetType());
-    return 1;
-}
-
-OEParseStatus OESyncRs::PushTranObject(const OETagDictionaryEntry* entry) {
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return OEPS_NORESOURCE;
-    OETransRs* trans = factory->NewTransRs(GetMsgSetVersion());
-    if (trans) {
-        trans->SetType(entry->m_id);
-        trans->SetMsgsRsTag(GetMsgsRsTag());
-    }
-    return AdoptListChild(this, m_trans, trans, entry->m_id);
-}
-
-OEParseStatus OESyncRs::HandleTagStart(const OETagDictionaryEntry* entry) {
-    if (!entry) return OEPS_INVALID;
-    if (IsSyncWrapper(entry->m_id, true)) return PushTranObject(entry);
-    return OEAggregate::HandleTagStart(entry);
-}
-
-int OESyncRs::Build(OEBuilder* builder) {
-    int status = OEAggregate::Build(builder);
-    if (status != OEBS_OK) return status;
-    return BuildEach(this, builder, m_trans);
 }
 
 unsigned short OESyncRs::AllRequiredPresent() {
@@ -732,51 +820,4 @@ unsigned short OESyncRs::AllRequiredPresent() {
     default:
         return 1;
     }
-}
-
-OEDataObj* OESyncRs::GetChild(unsigned short index) const {
-    unsigned short own = OEAggregate::GetNumberOfChildren();
-    if (index < own) return OEAggregate::GetChild(index);
-    return m_trans.Get(static_cast<unsigned short>(index - own));
-}
-
-unsigned short OESyncRs::GetNumberOfChildren() const {
-    return static_cast<unsigned short>(OEAggregate::GetNumberOfChildren() + m_trans.Entries());
-}
-
-namespace {
-
-// Copies a list of wrappers (the wrappers' own tags and children included) through the factory.
-template <class T> unsigned short CopyWrappers(OEDataObjList& to, const OEDataObjList& from, bool request) {
-    to.DeleteAll();
-    OEDataObjFactory* factory = OEDataObj::GetFactory();
-    if (!factory) return 0;
-    for (unsigned short i = 0; i < from.Entries(); ++i) {
-        const T* src = static_cast<const T*>(from.Get(i));
-        if (!src) continue;
-        T* copy =
-            request ? static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRq(src->GetMsgSetVersion())))
-                    : static_cast<T*>(static_cast<OEDataObj*>(factory->NewTransRs(src->GetMsgSetVersion())));
-        if (!copy) return 0;
-        if (!to.Append(copy)) {
-            delete copy;
-            return 0;
-        }
-        if (!copy->DeepCopyFrom(src)) return 0;
-    }
-    return 1;
-}
-
-} // namespace
-
-unsigned short OESyncRq::CopyExtraFrom(const OEAggregate* other) {
-    const OESyncRq* src = static_cast<const OESyncRq*>(other);
-    m_msgsTag = src->m_msgsTag;
-    return CopyWrappers<OETransRq>(m_trans, src->m_trans, true);
-}
-
-unsigned short OESyncRs::CopyExtraFrom(const OEAggregate* other) {
-    const OESyncRs* src = static_cast<const OESyncRs*>(other);
-    m_msgsTag = src->m_msgsTag;
-    return CopyWrappers<OETransRs>(m_trans, src->m_trans, false);
 }

@@ -55,18 +55,46 @@ public:
     OEString m_title, m_msg;
 };
 
-// Every transaction request wrapper; its own tag says which one.
-class OE_API OETransRq : public OETransBase {
+// The common part of the transaction request and response wrappers: the inner aggregate (one
+// slot that every inner row of the table shares), TRNUID, CLTCOOKIE and the enclosing set's tag.
+class OE_API OETransWrapper : public OETransBase {
 public:
-    explicit OETransRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
+    explicit OETransWrapper(unsigned short version = 0) : OETransBase(version) {}
     OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
-    // Replaces the inner request (the old one is deleted) and marks its tag.
+    // Replaces the inner aggregate (the old one is deleted) and marks its tag; null only clears.
+    // 0 for an object whose tag is no inner row of the wrapper.
     unsigned short SetActualTrans(OETransBase* inner);
     const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
     unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
     const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
     unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
+
+    unsigned short CopyExtraFrom(const OEAggregate* other) override {
+        m_msgsTag = static_cast<const OETransWrapper*>(other)->m_msgsTag;
+        return 1;
+    }
+
+    OEOwnedChild m_actual;
+    OEString36 m_trnUid;
+    OEString255 m_cltCookie;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // The field row of an inner aggregate (a child row in the inner slot), or null.
+    const OEFieldRow* FindInnerRow(OETagID tag) const;
+    // Creates the inner aggregate for a start tag as the actual transaction: 3 without a factory
+    // or memory, 4 for a tag without a class (yet); efileTag (K.EFILERQ or K.EFILERS) succeeds
+    // only when an inner aggregate is held.
+    OEParseStatus NewInner(OETagID tag, OETagID efileTag);
+    // NewInner, then the inner aggregate is the object being parsed.
+    OEParseStatus StartInner(const OETagDictionaryEntry* entry, OETagID efileTag);
+};
+
+// Every transaction request wrapper; its own tag says which one.
+class OE_API OETransRq : public OETransWrapper {
+public:
+    explicit OETransRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
     const OEString* GetTAN() const { return GetText(OETAG_TAN); }
     unsigned short SetTAN(const OEString& v) { return SetFromText(OETAG_TAN, v); }
     unsigned short GetSyncCompleteInfo() const {
@@ -81,41 +109,22 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override {
-        m_msgsTag = static_cast<const OETransRq*>(other)->m_msgsTag;
-        return 1;
-    }
 
-    OEOwnedChild m_actual;
-    OEString36 m_trnUid;
     unsigned short m_syncCompleteInfo = 0;
-    OEString255 m_cltCookie;
     OEBoundedString<80> m_tan;
-    OETagID m_msgsTag = OETAG_NONE;
-
-protected:
-    // Creates the inner request for a start tag as the actual transaction: 3 without a factory
-    // or memory, 4 for a tag without a class (yet); K.EFILERQ succeeds only when one is held.
-    OEParseStatus NewRq(OETagID tag);
 };
 
 // Every transaction response wrapper.
-class OE_API OETransRs : public OETransBase {
+class OE_API OETransRs : public OETransWrapper {
 public:
     explicit OETransRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OETransBase* GetActualTrans() const { return static_cast<OETransBase*>(m_actual.get()); }
-    unsigned short SetActualTrans(OETransBase* inner);
     // Hands the inner response to the caller (not deleted).
     OETransBase* DisconnectActualTrans();
     OEStatus* GetStatus() const { return static_cast<OEStatus*>(m_status.get()); }
     unsigned short SetStatus(OEStatus* status) { return SetChildObj(OETAG_STATUS, status); }
     OEWarning* GetWarning() const { return static_cast<OEWarning*>(m_warning.get()); }
     unsigned short SetWarning(OEWarning* warning) { return SetChildObj(OETAG_WARNING, warning); }
-    const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
-    unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
-    const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
-    unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
     void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
     // STATUS present with SEVERITY ERROR.
@@ -125,30 +134,93 @@ public:
 
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override {
-        m_msgsTag = static_cast<const OETransRs*>(other)->m_msgsTag;
-        return 1;
-    }
 
-    OEOwnedChild m_actual, m_status, m_warning;
-    OEString36 m_trnUid;
-    OEString255 m_cltCookie;
-    OETagID m_msgsTag = OETAG_NONE;
-
-protected:
-    // Creates the inner response for a start tag (the mirror of OETransRq::NewRq).
-    OEParseStatus NewRs(OETagID tag);
+    OEOwnedChild m_status, m_warning;
 };
 
-// Every synchronisation request (...SYNCRQ).
-class OE_API OESyncRq : public OEAggregate {
+// MULTIINTERTRNRQ: a transaction request wrapper that carries one or more INTERRQ, in order. The
+// requests live in a list of their own; the single inner slot of the plain wrapper stays empty.
+class OE_API OEMultiTransRq : public OETransRq {
 public:
-    explicit OESyncRq(unsigned short version = 0);
+    explicit OEMultiTransRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
+    unsigned short AppendInterRq(OETransBase* rq) { return AppendToList(OETAG_INTERRQ, rq); }
+    OETransBase* GetInterRq(unsigned short index) const {
+        return static_cast<OETransBase*>(m_inter.Get(index));
+    }
+    unsigned short GetNumInterRq() const { return m_inter.Entries(); }
+    // An INTERRQ is made by the creator the plain wrapper has for it: 4 while there is none.
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    // TRNUID and at least one INTERRQ.
+    unsigned short AllRequiredPresent() override;
+
+    OEDataObjList m_inter;
+};
+
+// MULTIINTERTRNRS: the response wrapper with zero or more INTERRS (none when STATUS reports an
+// error).
+class OE_API OEMultiTransRs : public OETransRs {
+public:
+    explicit OEMultiTransRs(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
+    unsigned short AppendInterRs(OETransBase* rs) { return AppendToList(OETAG_INTERRS, rs); }
+    OETransBase* GetInterRs(unsigned short index) const {
+        return static_cast<OETransBase*>(m_inter.Get(index));
+    }
+    unsigned short GetNumInterRs() const { return m_inter.Entries(); }
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+
+    OEDataObjList m_inter;
+};
+
+// The common part of the synchronisation request and response: TOKEN / TOKEN2, the account, the
+// transaction wrappers listed after the elements, and the enclosing set's tag. `request` selects
+// the side.
+class OE_API OESyncBase : public OEAggregate {
+public:
+    OESyncBase(unsigned short version, bool request);
     const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
     unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
     const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
     unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
+    OEDataObj* GetAccount() const { return m_account.get(); }
+    // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
+    unsigned short SetAccount(OEDataObj* account);
+    unsigned short GetNumTrans() const { return m_trans.Entries(); }
+    void DeleteAllTrans() { m_trans.DeleteAll(); }
+
+    // A transaction wrapper of the side goes to the list; any other tag as the rows say.
+    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
+    // The rows, then the wrappers.
+    int Build(OEBuilder* builder) override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    // The set's tag and the wrappers.
+    unsigned short CopyExtraFrom(const OEAggregate* other) override;
+
+    OEString m_token, m_token2;
+    unsigned short m_kestRefresh = 0;
+    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    OEOwnedChild m_account;
+    OEDataObjList m_trans;
+    OETagID m_msgsTag = OETAG_NONE;
+
+protected:
+    // Appends a wrapper, or replaces the one at index (an index above the count is refused), and
+    // marks its tag. A null wrapper is refused (0).
+    unsigned short StoreTrans(unsigned short index, OETransWrapper* trans, bool append);
+
+    bool m_request;
+
+private:
+    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
+};
+
+// Every synchronisation request (...SYNCRQ).
+class OE_API OESyncRq : public OESyncBase {
+public:
+    explicit OESyncRq(unsigned short version = 0);
+    const OEAggregateDesc& Describe() const override;
     unsigned short GetTokenOnly() const { return static_cast<unsigned short>(GetNumber(OETAG_TOKENONLY)); }
     unsigned short SetTokenOnly(unsigned short v) { return SetNumber(OETAG_TOKENONLY, v); }
     unsigned short GetRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_REFRESH)); }
@@ -170,77 +242,39 @@ public:
     }
     unsigned short SetKestRefresh(unsigned short v) { return SetNumber(OETAG_KEST_REFRESH, v); }
     unsigned short SetKestSyncError(unsigned long v) { return SetNumber(OETAG_KEST_SYNCERROR, v); }
-    OEDataObj* GetAccount() const { return m_account.get(); }
-    // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
-    unsigned short SetAccount(OEDataObj* account);
-    unsigned short AppendTrans(OETransRq* trans);
-    unsigned short SetTrans(unsigned short index, OETransRq* trans);
+    unsigned short AppendTrans(OETransRq* trans) { return StoreTrans(0, trans, true); }
+    unsigned short SetTrans(unsigned short index, OETransRq* trans) {
+        return StoreTrans(index, trans, false);
+    }
     OETransRq* GetTrans(unsigned short index) const { return static_cast<OETransRq*>(m_trans.Get(index)); }
-    unsigned short GetNumTrans() const { return m_trans.Entries(); }
-    void DeleteAllTrans() { m_trans.DeleteAll(); }
     OETagID GetMsgsRqTag() const { return m_msgsTag; }
     void SetMsgsRqTag(OETagID tag) { m_msgsTag = tag; }
     // Inner request tag to its synchronisation wrapper; 0 for any other tag.
     static OETagID MsgIDToSyncWrapper(OETagID tag);
 
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    int Build(OEBuilder* builder) override;
     unsigned short AllRequiredPresent() override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
-    OEString m_token, m_token2;
     unsigned short m_tokenOnly = 0, m_refresh = 0, m_rejectIfMissing = 0, m_incImages = 0, m_useHtml = 0;
-    unsigned short m_kestRefresh = 0;
-    unsigned long m_syncError = 0, m_kestSyncError = 0;
-    OEOwnedChild m_account;
-    OEDataObjList m_trans;
-    OETagID m_msgsTag = OETAG_NONE;
-
-private:
-    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
 };
 
 // Every synchronisation response (...SYNCRS).
-class OE_API OESyncRs : public OEAggregate {
+class OE_API OESyncRs : public OESyncBase {
 public:
     explicit OESyncRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
-    unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
-    const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
-    unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
     unsigned short GetLostSync() const { return static_cast<unsigned short>(GetNumber(OETAG_LOSTSYNC)); }
     unsigned short SetLostSync(unsigned short v) { return SetNumber(OETAG_LOSTSYNC, v); }
     const OEString* GetTranUID() const { return GetText(OETAG_TRNUID); }
     unsigned short SetTranUID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
-    OEDataObj* GetAccount() const { return m_account.get(); }
-    unsigned short SetAccount(OEDataObj* account);
-    unsigned short AppendTrans(OETransRs* trans);
+    unsigned short AppendTrans(OETransRs* trans) { return StoreTrans(0, trans, true); }
     OETransRs* GetTrans(unsigned short index) const { return static_cast<OETransRs*>(m_trans.Get(index)); }
-    unsigned short GetNumTrans() const { return m_trans.Entries(); }
-    void DeleteAllTrans() { m_trans.DeleteAll(); }
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
     void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
 
-    OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
-    int Build(OEBuilder* builder) override;
     unsigned short AllRequiredPresent() override;
-    OEDataObj* GetChild(unsigned short index) const override;
-    unsigned short GetNumberOfChildren() const override;
-    unsigned short CopyExtraFrom(const OEAggregate* other) override;
 
-    OEString m_token, m_token2;
-    unsigned short m_lostSync = 0, m_kestRefresh = 0;
-    unsigned long m_syncError = 0, m_kestSyncError = 0;
+    unsigned short m_lostSync = 0;
     OEString36 m_trnUid;
-    OEOwnedChild m_account;
-    OEDataObjList m_trans;
-    OETagID m_msgsTag = OETAG_NONE;
-
-private:
-    OEParseStatus PushTranObject(const OETagDictionaryEntry* entry);
 };
 
 // The response tag of a request tag (STMTRQ gives STMTRS, STMTTRNRQ gives STMTTRNRS); 0 when the

@@ -112,11 +112,15 @@ void OENetAccess::LogMessage(const char* text, unsigned short level, const char*
 
 void OENetAccess::LogFormat(unsigned short level, const char* format, ...) {
     if (!m_logCallback) return;
-    char line[1024];
     va_list args;
     va_start(args, format);
-    std::vsnprintf(line, sizeof line, format, args);
+    LogFormatV(level, format, args);
     va_end(args);
+}
+
+void OENetAccess::LogFormatV(unsigned short level, const char* format, va_list args) {
+    char line[1024];
+    std::vsnprintf(line, sizeof line, format, args);
     LogMessage(line, level, "");
 }
 
@@ -171,6 +175,20 @@ OENetStatus OENetRequest::GetReplySize(unsigned long* size) {
     if (n < 0) return OENetReplySizeFailed;
     if (size) *size = static_cast<unsigned long>(n);
     return OENetOK;
+}
+
+bool OENetRequest::AppendFileInBlocks(const char* path, OEBuffer* buffer) {
+    const std::size_t kBlock = 10000;
+    std::FILE* f = _LDfopen(path, "rb");
+    if (!f) return false;
+    char block[kBlock];
+    for (;;) {
+        std::size_t n = std::fread(block, 1, kBlock, f);
+        if (n > 0 && buffer->Write(block, static_cast<unsigned short>(n)) != OEBR_SUCCESS) break;
+        if (n < kBlock) break;
+    }
+    std::fclose(f);
+    return true;
 }
 
 OENetStatus OENetRequest::LoadReply(OEBuffer* buffer) {

@@ -10,6 +10,7 @@
 #include "foundation/oebuffer.h"
 #include "foundation/oestring.h"
 
+#include <cstdarg>
 #include <cstddef>
 
 // Result of every transport operation.
@@ -77,6 +78,12 @@ public:
     void LogFormat(unsigned short level, const char* format, ...)
 #if defined(__GNUC__)
         __attribute__((format(printf, 3, 4)))
+#endif
+        ;
+    // The same over a va_list, handed to LogMessage whether or not a callback is set.
+    void LogFormatV(unsigned short level, const char* format, va_list args)
+#if defined(__GNUC__)
+        __attribute__((format(printf, 3, 0)))
 #endif
         ;
     virtual void UpdateSessionStatus(OEOpCode op, void* first, void* second);
@@ -168,6 +175,10 @@ public:
     const OEString& GetURL() const { return m_url; }
 
 protected:
+    // Appends a whole file to a buffer in blocks of 10000 bytes until a block comes back short (or
+    // the buffer cannot grow). false when the file cannot be opened.
+    static bool AppendFileInBlocks(const char* path, OEBuffer* buffer);
+
     OEString m_url;
 };
 

@@ -77,19 +77,11 @@ OENetStatus ReceiverRequest::Get(const OEString& url) {
 
 OENetStatus ReceiverRequest::LoadReply(OEBuffer* buffer) {
     if (!buffer || m_replySize == 0) return OENetReplyLoadFailed;
-    std::FILE* f = _LDfopen(m_replyFile, "rb");
-    if (!f) {
+    if (!AppendFileInBlocks(m_replyFile, buffer)) {
         Util::GetOps().Message(1, 0, kModule, __LINE__, "ReceiverRequest::LoadReply", "cannot open %s",
                                m_replyFile);
         return OENetReplyLoadFailed;
     }
-    char block[kBlock];
-    for (;;) {
-        std::size_t n = std::fread(block, 1, kBlock, f);
-        if (n > 0 && buffer->Write(block, static_cast<unsigned short>(n)) != OEBR_SUCCESS) break;
-        if (n < kBlock) break;
-    }
-    std::fclose(f);
     return buffer->GetBufferSize() == m_replySize ? OENetOK : OENetReplyLoadFailed;
 }
 

@@ -11,7 +11,6 @@
 
 namespace {
 const char kModule[] = "vrnacc";
-const unsigned long kBlock = 10000;
 
 bool IsHttpsScheme(const char* url) {
     return std::strncmp(url, "https:", 6) == 0;
@@ -19,21 +18,6 @@ bool IsHttpsScheme(const char* url) {
 
 void CopyPath(char (&out)[1024], const char* in) {
     std::snprintf(out, sizeof out, "%s", in ? in : "");
-}
-
-// Appends a whole file to a buffer in blocks of 10000 bytes until a block comes back short.
-// Returns false when the file cannot be opened.
-bool ReadFileInto(const char* path, OEBuffer* buffer) {
-    std::FILE* f = _LDfopen(path, "rb");
-    if (!f) return false;
-    char block[kBlock];
-    for (;;) {
-        std::size_t n = std::fread(block, 1, kBlock, f);
-        if (n > 0 && buffer->Write(block, static_cast<unsigned short>(n)) != OEBR_SUCCESS) break;
-        if (n < kBlock) break;
-    }
-    std::fclose(f);
-    return true;
 }
 
 void RemoveFile(const char* path) {
@@ -180,12 +164,10 @@ void VRNNetRequest::ReleaseTicket() {
 
 void VRNNetRequest::Log(unsigned short level, const char* format, ...) {
     if (!m_access) return;
-    char line[1024];
     va_list args;
     va_start(args, format);
-    std::vsnprintf(line, sizeof line, format, args);
+    m_access->LogFormatV(level, format, args);
     va_end(args);
-    m_access->LogMessage(line, level, "");
 }
 
 OENetStatus VRNNetRequest::Send(const OEString& url, OEBuffer* body) {
@@ -201,28 +183,7 @@ OENetStatus VRNNetRequest::SendPlusHeadersContent(const OEString& url, OEBuffer*
     m_request = nullptr;
     m_url = url;
     Log(OENetLogDetail, "VRN: Beginning send to %s", url.c_str());
-    OENetStatus status = OENetOK;
-    if (!m_access) {
-        status = OENetRequestFailed;
-    } else {
-        OEString temp = m_access->GetTempFilePath();
-        status = m_access->OpenInternetIfNeeded();
-        if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
-        if (status == OENetOK) {
-            long result = 0;
-            const char* bytes = body && body->GetBufferPtr() ? body->GetBufferPtr() : "";
-            unsigned long length = body && body->GetBufferPtr() ? body->GetBufferSize() : 0;
-            m_request =
-                m_access->GetClient()->ICSendDataRequest(&result, m_access->m_session, url.c_str(), bytes,
-                                                         length, temp.c_str(), CompletionCallback, m_ticket);
-            if (result != 0 || !m_request) {
-                Log(OENetLogError, "***VRN ICSendDataRequest:  %d", static_cast<int>(result));
-                status = OENetRequestFailed;
-            } else {
-                status = Transfer(true, contentType, headers);
-            }
-        }
-    }
+    OENetStatus status = m_access ? Begin(true, body, contentType, headers) : OENetRequestFailed;
     Log(OENetLogDetail, "VRN: End send to %s, netstatus %d", url.c_str(), static_cast<int>(status));
     m_request = nullptr;
     return status;
@@ -238,24 +199,37 @@ OENetStatus VRNNetRequest::Get(const OEString& url) {
         Log(OENetLogError, "***VRN: ICGetFileRequest returns %d", 3);
         status = OENetRequestFailed;
     } else {
-        OEString temp = m_access->GetTempFilePath();
-        status = m_access->OpenInternetIfNeeded();
-        if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
-        if (status == OENetOK) {
-            long result = 0;
-            m_request = m_access->GetClient()->ICGetFileRequest(&result, m_access->m_session, url.c_str(),
-                                                                temp.c_str(), CompletionCallback, m_ticket);
-            if (result != 0 || !m_request) {
-                Log(OENetLogError, "***VRN: ICGetFileRequest returns %d", static_cast<int>(result));
-                status = OENetRequestFailed;
-            } else {
-                status = Transfer(false, nullptr, nullptr);
-            }
-        }
+        status = Begin(false, nullptr, nullptr, nullptr);
     }
     Log(OENetLogDetail, "VRN: End get from %s, netstatus %d", url.c_str(), static_cast<int>(status));
     m_request = nullptr;
     return status;
+}
+
+// Opens the session when needed, makes the client request for m_url (a POST of body, or a GET)
+// and carries it through Transfer.
+OENetStatus VRNNetRequest::Begin(bool post, OEBuffer* body, const char* contentType, const char* headers) {
+    OEString temp = m_access->GetTempFilePath();
+    OENetStatus status = m_access->OpenInternetIfNeeded();
+    if (status == OENetOK && !NewTicket()) status = OENetOutOfMemory;
+    if (status != OENetOK) return status;
+    OEHttpClient* client = m_access->GetClient();
+    long result = 0;
+    if (post) {
+        const char* bytes = body && body->GetBufferPtr() ? body->GetBufferPtr() : "";
+        unsigned long length = body && body->GetBufferPtr() ? body->GetBufferSize() : 0;
+        m_request = client->ICSendDataRequest(&result, m_access->m_session, m_url.c_str(), bytes, length,
+                                              temp.c_str(), CompletionCallback, m_ticket);
+    } else {
+        m_request = client->ICGetFileRequest(&result, m_access->m_session, m_url.c_str(), temp.c_str(),
+                                             CompletionCallback, m_ticket);
+    }
+    if (result != 0 || !m_request) {
+        Log(OENetLogError, post ? "***VRN ICSendDataRequest:  %d" : "***VRN: ICGetFileRequest returns %d",
+            static_cast<int>(result));
+        return OENetRequestFailed;
+    }
+    return Transfer(post, contentType, headers);
 }
 
 // Steps after the client made the request: TLS settings, HTTP settings, start, wait, results.
@@ -318,7 +292,7 @@ OENetStatus VRNNetRequest::Transfer(bool post, const char* contentType, const ch
 
     if (m_saveHeaders == 1) {
         m_replyHeaders.ClearBuffer(0);
-        ReadFileInto(m_headerFile, &m_replyHeaders);
+        AppendFileInBlocks(m_headerFile, &m_replyHeaders);
     }
     if (m_completionCode != 0 || m_replySize == 0) {
         RemoveFile(m_replyFile);
@@ -504,7 +478,7 @@ OENetStatus VRNNetRequest::MapNetStatus(unsigned long code) {
 OENetStatus VRNNetRequest::LoadReply(OEBuffer* buffer) {
     if (HasFileScheme(m_url.c_str())) return OENetRequest::LoadReply(buffer);
     if (!buffer || m_replySize == 0) return OENetReplyLoadFailed;
-    if (!ReadFileInto(m_replyFile, buffer)) return OENetReplyLoadFailed;
+    if (!AppendFileInBlocks(m_replyFile, buffer)) return OENetReplyLoadFailed;
     RemoveFile(m_replyFile);
     RemoveFile(m_headerFile);
     std::uint32_t expected = m_replySize;

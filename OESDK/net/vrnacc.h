@@ -117,6 +117,8 @@ protected:
     void AddAllTrustedRoots(ICRequest request);
     void Wait();
     unsigned short AppendRoot(const unsigned char* bytes, unsigned short length, short rootId, bool ber);
+    // Makes the client request of a send or a get and carries it through Transfer.
+    OENetStatus Begin(bool post, OEBuffer* body, const char* contentType, const char* headers);
     // Steps shared by send and get once the client request exists.
     OENetStatus Transfer(bool post, const char* contentType, const char* headers);
     void Log(unsigned short level, const char* format, ...)

@@ -8,6 +8,7 @@
 #include "platform/oehttpclient.h"
 
 #include "foundation/oememory.h"
+#include "platform/internal/oehttpclientbase.h"
 
 #include <curl/curl.h>
 #include <openssl/evp.h>
@@ -23,7 +24,6 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
-#include <map>
 #include <memory>
 #include <mutex>
 #include <string>
@@ -32,18 +32,6 @@
 #include <vector>
 
 namespace OEPlatform {
-
-namespace {
-void HexOf(const unsigned char* md, unsigned n, char out[41]) {
-    static const char kHex[] = "0123456789ABCDEF";
-    unsigned i = 0;
-    for (; i < n && i < 20; ++i) {
-        out[2 * i] = kHex[md[i] >> 4];
-        out[2 * i + 1] = kHex[md[i] & 15];
-    }
-    out[2 * i] = '\0';
-}
-} // namespace
 
 int DecodeCertificate(const unsigned char* bytes, unsigned long length, unsigned char** der,
                       unsigned long* derLength, char sha1Hex[41]) {
@@ -78,45 +66,21 @@ int DecodeCertificate(const unsigned char* bytes, unsigned long length, unsigned
 
 namespace {
 
-struct Root {
-    std::vector<unsigned char> der;
-    short id;
-};
+using OEPlatform::ICRequestBase;
+using OEPlatform::ICRoot;
+using OEPlatform::ICSessionBase;
 
-class CurlClient;
-
-struct Request {
-    std::uintptr_t handle = 0;
-    bool post = false;
-    std::string url, body, tempDir;
-    ICCompletionCallback callback = nullptr;
-    void* context = nullptr;
-    long ignoreErrors = 0;
-    std::string contentType, extraHeaders;
-    long noCache = 0;
-    long timeout = 0;
-    std::vector<Root> roots;
+struct Request : ICRequestBase {
     std::string trustFile;
-    ICCertificateCallback certCallback = nullptr;
-    void* certContext = nullptr;
-    std::thread thread;
-    bool started = false;
-    std::atomic<bool> cancelled{false};
-    std::atomic<bool> finished{false};
     long rejection = 0;
     CURL* easy = nullptr;
     unsigned long lastProgress[5] = {0, 0, 0, 0, 0};
-    std::string replyPath, headerPath;
     std::string agent;
 };
 
-struct Session {
-    std::mutex lock;
-    std::vector<std::unique_ptr<Request>> requests;
+struct Session : ICSessionBase {
     std::string agent;
 };
-
-std::atomic<std::uintptr_t> g_nextHandle{1};
 
 size_t WriteToFile(char* data, size_t size, size_t count, void* file) {
     return std::fwrite(data, size, count, static_cast<std::FILE*>(file)) * size;
@@ -149,7 +113,7 @@ CURLcode AddRoots(CURL*, void* sslContext, void* user) {
     X509_STORE* store = SSL_CTX_get_cert_store(static_cast<SSL_CTX*>(sslContext));
     if (!r->trustFile.empty() && X509_STORE_load_file(store, r->trustFile.c_str()) != 1)
         return CURLE_SSL_CACERT_BADFILE;
-    for (const Root& root : r->roots) {
+    for (const ICRoot& root : r->roots) {
         const unsigned char* p = root.der.data();
         X509* x = d2i_X509(nullptr, &p, static_cast<long>(root.der.size()));
         if (!x) return CURLE_SSL_CERTPROBLEM;
@@ -182,7 +146,7 @@ int BeforeRequest(void* user, char*, char*, int, int) {
     }
     short rootId = 0;
     if (!ders.empty() && SSL_get_verify_result(ssl) == X509_V_OK && SSL_get0_verified_chain(ssl))
-        for (const Root& root : r->roots)
+        for (const ICRoot& root : r->roots)
             if (root.der == ders.front()) {
                 rootId = root.id;
                 break;
@@ -261,7 +225,7 @@ std::FILE* MakeTempFile(const std::string& dir, const char* stem, std::string& p
     return f;
 }
 
-void Run(Request* r) {
+void Perform(Request* r) {
     unsigned long code = 0;
     std::FILE* reply = MakeTempFile(r->tempDir, "oesdk-reply-", r->replyPath);
     std::FILE* headers = reply ? MakeTempFile(r->tempDir, "oesdk-head-", r->headerPath) : nullptr;
@@ -329,16 +293,10 @@ void Run(Request* r) {
     if (list) curl_slist_free_all(list);
     if (r->easy) curl_easy_cleanup(r->easy);
     r->easy = nullptr;
-    ICCallbackData d{};
-    d.replyFile = r->replyPath.c_str();
-    d.headerFile = r->headerPath.c_str();
-    d.code = code;
-    // The callback is the last thing that touches the caller: it may go on at once.
-    if (r->callback) r->callback(kICStatusFinished, &d, r->context);
-    r->finished.store(true);
+    r->Finish(code);
 }
 
-class CurlClient : public OEHttpClient {
+class CurlClient : public OEPlatform::OEHttpClientBase {
 public:
     CurlClient() { curl_global_init(CURL_GLOBAL_DEFAULT); }
 
@@ -348,107 +306,17 @@ public:
         Session* s = new (std::nothrow) Session;
         if (error) *error = s ? 0 : kICNetworkErrorBase | kICErrInternal;
         if (s && agentName) s->agent = agentName;
-        return s;
+        return static_cast<ICSessionBase*>(s);
     }
 
     long ICConnect(long) override { return 0; }
 
     long ICCloseInet(ICSession session) override {
-        Session* s = static_cast<Session*>(session);
+        ICSessionBase* s = static_cast<ICSessionBase*>(session);
         if (!s) return kICNetworkErrorBase | 12018;
-        {
-            std::lock_guard<std::mutex> guard(s->lock);
-            for (auto& r : s->requests) r->cancelled.store(true);
-        }
-        for (auto& r : s->requests)
-            if (r->thread.joinable()) r->thread.join();
-        {
-            std::lock_guard<std::mutex> registry(m_lock);
-            for (auto& r : s->requests) m_live.erase(r->handle);
-        }
+        EndSession(*s);
         delete s;
         return 0;
-    }
-
-    ICRequest ICSendDataRequest(long* result, ICSession session, const char* url, const char* body,
-                                unsigned long length, const char* tempDir, ICCompletionCallback callback,
-                                void* context) override {
-        Request* r = Make(result, session, url, tempDir, callback, context);
-        if (r) {
-            r->post = true;
-            if (body && length) r->body.assign(body, length);
-        }
-        return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
-    }
-
-    ICRequest ICGetFileRequest(long* result, ICSession session, const char* url, const char* tempDir,
-                               ICCompletionCallback callback, void* context) override {
-        Request* r = Make(result, session, url, tempDir, callback, context);
-        return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
-    }
-
-    long ICSetSSLInfo(ICRequest request, long ignoreErrors) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        r->ignoreErrors = ignoreErrors;
-        return 0;
-    }
-
-    long ICSetHTTPInfo(ICRequest request, long, long post, const char* contentType, const char* extraHeaders,
-                       long noCache, long timeout) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        if (post && !r->post) return 87; // a get cannot become a post here
-        r->contentType = contentType ? contentType : "";
-        r->extraHeaders = extraHeaders ? extraHeaders : "";
-        r->noCache = noCache;
-        r->timeout = timeout < 0 ? 0 : timeout;
-        return 0;
-    }
-
-    long ICAddTrustedRoot(ICRequest request, const unsigned char* der, unsigned long length,
-                          short rootId) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        if (!der || !length) return 87;
-        r->roots.push_back(Root{std::vector<unsigned char>(der, der + length), rootId});
-        return 0;
-    }
-
-    long ICSetCertificateCallback(ICRequest request, ICCertificateCallback callback, void* context) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        r->certCallback = callback;
-        r->certContext = context;
-        return 0;
-    }
-
-    long ICInitiate(ICSession session, ICRequest request, long, long) override {
-        Request* r = Find(request);
-        if (!r || r->started || !session) return 12018;
-        {
-            std::lock_guard<std::mutex> guard(m_lock);
-            r->trustFile = m_trustFile;
-        }
-        try {
-            r->thread = std::thread(Run, r);
-        } catch (...) {
-            return kICErrInternal;
-        }
-        r->started = true;
-        return 0;
-    }
-
-    long ICCancel(ICSession session, ICRequest request) override {
-        Session* s = static_cast<Session*>(session);
-        if (!s) return 12018;
-        std::lock_guard<std::mutex> guard(s->lock);
-        for (auto& r : s->requests)
-            if (r->handle == reinterpret_cast<std::uintptr_t>(request)) {
-                r->cancelled.store(true);
-                return 0;
-            }
-        return 12018;
     }
 
     long ICSetTrustStoreFile(const char* pemFile) override {
@@ -458,55 +326,19 @@ public:
         return 0;
     }
 
+protected:
+    std::shared_ptr<ICRequestBase> NewRequest(ICSessionBase& s) override {
+        std::shared_ptr<Request> r(new (std::nothrow) Request);
+        if (r) r->agent = static_cast<Session&>(s).agent;
+        return r;
+    }
+
+    void TakeTrustStore(ICRequestBase& r) override { static_cast<Request&>(r).trustFile = m_trustFile; }
+
+    void Run(std::shared_ptr<ICRequestBase> r) override { Perform(static_cast<Request*>(r.get())); }
+
 private:
-    Request* Make(long* result, ICSession session, const char* url, const char* tempDir,
-                  ICCompletionCallback callback, void* context) {
-        Session* s = static_cast<Session*>(session);
-        if (result) *result = 0;
-        if (!s || !url || !*url) {
-            if (result) *result = 87;
-            return nullptr;
-        }
-        std::unique_ptr<Request> r(new (std::nothrow) Request);
-        if (!r) {
-            if (result) *result = 8;
-            return nullptr;
-        }
-        r->handle = g_nextHandle.fetch_add(1);
-        r->url = url;
-        r->tempDir = tempDir ? tempDir : "";
-        r->callback = callback;
-        r->context = context;
-        r->agent = s->agent;
-        Request* raw = r.get();
-        std::lock_guard<std::mutex> guard(s->lock);
-        std::lock_guard<std::mutex> registry(m_lock);
-        // Finished transfers are reaped here; handles are never reused, so a late ICCancel on a
-        // reaped one finds nothing rather than another transfer.
-        for (size_t i = 0; i < s->requests.size();) {
-            Request* old = s->requests[i].get();
-            if (old->started && old->finished.load()) {
-                old->thread.join();
-                m_live.erase(old->handle);
-                s->requests.erase(s->requests.begin() + static_cast<long>(i));
-            } else {
-                ++i;
-            }
-        }
-        s->requests.push_back(std::move(r));
-        m_live[raw->handle] = raw;
-        return raw;
-    }
-
-    Request* Find(ICRequest request) {
-        std::lock_guard<std::mutex> guard(m_lock);
-        auto it = m_live.find(reinterpret_cast<std::uintptr_t>(request));
-        return it == m_live.end() ? nullptr : it->second;
-    }
-
-    std::mutex m_lock; // guards m_trustFile and m_live
-    std::string m_trustFile;
-    std::map<std::uintptr_t, Request*> m_live;
+    std::string m_trustFile; // guarded by m_lock
 };
 
 } // namespace

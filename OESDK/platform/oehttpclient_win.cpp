@@ -10,6 +10,7 @@
 #include "platform/oehttpclient.h"
 
 #include "foundation/oememory.h"
+#include "platform/internal/oehttpclientbase.h"
 #include "platform/oeplatform.h"
 
 #include <windows.h>
@@ -22,7 +23,6 @@
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
-#include <map>
 #include <memory>
 #include <mutex>
 #include <string>
@@ -30,18 +30,6 @@
 #include <vector>
 
 namespace OEPlatform {
-
-namespace {
-void HexOf(const BYTE* md, DWORD n, char out[41]) {
-    static const char kHex[] = "0123456789ABCDEF";
-    DWORD i = 0;
-    for (; i < n && i < 20; ++i) {
-        out[2 * i] = kHex[md[i] >> 4];
-        out[2 * i + 1] = kHex[md[i] & 15];
-    }
-    out[2 * i] = '\0';
-}
-} // namespace
 
 int DecodeCertificate(const unsigned char* bytes, unsigned long length, unsigned char** der,
                       unsigned long* derLength, char sha1Hex[41]) {
@@ -116,36 +104,18 @@ std::string Narrow(const wchar_t* w, size_t length) {
     return s;
 }
 
-struct Root {
-    std::vector<unsigned char> der;
-    short id;
-};
+using OEPlatform::ICRequestBase;
+using OEPlatform::ICRoot;
+using OEPlatform::ICSessionBase;
 
-struct Request {
-    std::uintptr_t handle = 0;
+struct Request : ICRequestBase {
     HINTERNET session = nullptr;
-    bool post = false;
-    std::string url, body, tempDir;
-    ICCompletionCallback callback = nullptr;
-    void* context = nullptr;
-    long ignoreErrors = 0;
-    std::string contentType, extraHeaders;
-    long noCache = 0;
-    long timeout = 0;
-    std::vector<Root> roots;
     std::vector<std::vector<unsigned char>> trustFile; // DER roots of the trust store file
-    ICCertificateCallback certCallback = nullptr;
-    void* certContext = nullptr;
-    std::thread thread;
-    bool started = false;
-    std::atomic<bool> cancelled{false};
-    std::atomic<bool> finished{false};
-    std::mutex handleLock; // guards hRequest against a cancel from another thread
+    std::mutex handleLock;                             // guards hRequest against a cancel from another thread
     HINTERNET hRequest = nullptr;
-    std::string replyPath, headerPath;
-    // Between the transfer's worker and its supervising thread (Run): a blocked WinHTTP call
-    // that neither a cancel nor the time-out can interrupt is abandoned, and from then on the
-    // worker calls nobody back and removes its own files when it finally returns.
+    // Between the transfer's worker and its supervising thread (Supervise): a blocked WinHTTP
+    // call that neither a cancel nor the time-out can interrupt is abandoned, and from then on
+    // the worker calls nobody back and removes its own files when it finally returns.
     std::mutex stateLock;
     std::condition_variable changed;
     bool workerDone = false;
@@ -153,13 +123,9 @@ struct Request {
     unsigned long workerCode = 0;
 };
 
-struct Session {
-    std::mutex lock;
+struct Session : ICSessionBase {
     HINTERNET internet = nullptr;
-    std::vector<std::shared_ptr<Request>> requests;
 };
-
-std::atomic<std::uintptr_t> g_nextHandle{1};
 
 unsigned long NetError(DWORD e) {
     switch (e) {
@@ -238,7 +204,7 @@ unsigned long CheckServer(Request* r, HINTERNET h) {
         anchors.push_back(c);
         ids.push_back(id);
     };
-    for (const Root& root : r->roots) add(root.der, root.id);
+    for (const ICRoot& root : r->roots) add(root.der, root.id);
     for (const auto& der : r->trustFile) add(der, -1);
 
     unsigned long code = kICNetworkErrorBase | kICErrSecureFailure;
@@ -423,7 +389,7 @@ unsigned long Transfer(Request* r, std::FILE* reply, std::FILE* headers) {
     return code;
 }
 
-void Run(std::shared_ptr<Request> r) {
+void Supervise(std::shared_ptr<Request> r) {
     unsigned long code;
     std::FILE* reply = MakeTempFile(r->tempDir, "oer", r->replyPath);
     std::FILE* headers = reply ? MakeTempFile(r->tempDir, "oeh", r->headerPath) : nullptr;
@@ -464,12 +430,7 @@ void Run(std::shared_ptr<Request> r) {
             code = kICNetworkErrorBase | kICErrInternal;
         }
     }
-    ICCallbackData d{};
-    d.replyFile = r->replyPath.c_str();
-    d.headerFile = r->headerPath.c_str();
-    d.code = code;
-    if (r->callback) r->callback(kICStatusFinished, &d, r->context);
-    r->finished.store(true);
+    r->Finish(code);
 }
 
 // The DER certificates of a PEM file.
@@ -500,7 +461,7 @@ bool ReadPemFile(const char* path, std::vector<std::vector<unsigned char>>& out)
     return !out.empty();
 }
 
-class WinHttpClient : public OEHttpClient {
+class WinHttpClient : public OEPlatform::OEHttpClientBase {
 public:
     long ICNeedsInternetSetup() override { return 0; }
 
@@ -520,109 +481,18 @@ public:
         }
         s->internet = internet;
         if (error) *error = 0;
-        return s;
+        return static_cast<ICSessionBase*>(s);
     }
 
     long ICConnect(long) override { return 0; }
 
     long ICCloseInet(ICSession session) override {
-        Session* s = static_cast<Session*>(session);
+        Session* s = static_cast<Session*>(static_cast<ICSessionBase*>(session));
         if (!s) return 12018;
-        {
-            std::lock_guard<std::mutex> guard(s->lock);
-            for (auto& r : s->requests) Cancel(r.get());
-        }
-        for (auto& r : s->requests)
-            if (r->thread.joinable()) r->thread.join();
-        {
-            std::lock_guard<std::mutex> registry(m_lock);
-            for (auto& r : s->requests) m_live.erase(r->handle);
-        }
+        EndSession(*s);
         WinHttpCloseHandle(s->internet);
         delete s;
         return 0;
-    }
-
-    ICRequest ICSendDataRequest(long* result, ICSession session, const char* url, const char* body,
-                                unsigned long length, const char* tempDir, ICCompletionCallback callback,
-                                void* context) override {
-        Request* r = Make(result, session, url, tempDir, callback, context);
-        if (r) {
-            r->post = true;
-            if (body && length) r->body.assign(body, length);
-        }
-        return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
-    }
-
-    ICRequest ICGetFileRequest(long* result, ICSession session, const char* url, const char* tempDir,
-                               ICCompletionCallback callback, void* context) override {
-        Request* r = Make(result, session, url, tempDir, callback, context);
-        return r ? reinterpret_cast<ICRequest>(r->handle) : nullptr;
-    }
-
-    long ICSetSSLInfo(ICRequest request, long ignoreErrors) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        r->ignoreErrors = ignoreErrors;
-        return 0;
-    }
-
-    long ICSetHTTPInfo(ICRequest request, long, long post, const char* contentType, const char* extraHeaders,
-                       long noCache, long timeout) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        if (post && !r->post) return 87;
-        r->contentType = contentType ? contentType : "";
-        r->extraHeaders = extraHeaders ? extraHeaders : "";
-        r->noCache = noCache;
-        r->timeout = timeout < 0 ? 0 : timeout;
-        return 0;
-    }
-
-    long ICAddTrustedRoot(ICRequest request, const unsigned char* der, unsigned long length,
-                          short rootId) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        if (!der || !length) return 87;
-        r->roots.push_back(Root{std::vector<unsigned char>(der, der + length), rootId});
-        return 0;
-    }
-
-    long ICSetCertificateCallback(ICRequest request, ICCertificateCallback callback, void* context) override {
-        Request* r = Find(request);
-        if (!r) return 12018;
-        r->certCallback = callback;
-        r->certContext = context;
-        return 0;
-    }
-
-    long ICInitiate(ICSession session, ICRequest request, long, long) override {
-        Request* r = Find(request);
-        if (!r || r->started || !session) return 12018;
-        {
-            std::lock_guard<std::mutex> guard(m_lock);
-            r->trustFile = m_trustFile;
-        }
-        std::shared_ptr<Request> shared = Shared(r);
-        try {
-            r->thread = std::thread(Run, shared);
-        } catch (...) {
-            return kICErrInternal;
-        }
-        r->started = true;
-        return 0;
-    }
-
-    long ICCancel(ICSession session, ICRequest request) override {
-        Session* s = static_cast<Session*>(session);
-        if (!s) return 12018;
-        std::lock_guard<std::mutex> guard(s->lock);
-        for (auto& r : s->requests)
-            if (r->handle == reinterpret_cast<std::uintptr_t>(request)) {
-                Cancel(r.get());
-                return 0;
-            }
-        return 12018;
     }
 
     long ICSetTrustStoreFile(const char* pemFile) override {
@@ -633,9 +503,20 @@ public:
         return 0;
     }
 
-private:
+protected:
+    std::shared_ptr<ICRequestBase> NewRequest(ICSessionBase& s) override {
+        std::shared_ptr<Request> r(new (std::nothrow) Request);
+        if (r) r->session = static_cast<Session&>(s).internet;
+        return r;
+    }
+
+    void TakeTrustStore(ICRequestBase& r) override { static_cast<Request&>(r).trustFile = m_trustFile; }
+
+    void Run(std::shared_ptr<ICRequestBase> r) override { Supervise(std::static_pointer_cast<Request>(r)); }
+
     // Closing the request handle makes a blocked WinHTTP call on the transfer thread return.
-    static void Cancel(Request* r) {
+    void Cancel(ICRequestBase& base) override {
+        Request* r = static_cast<Request*>(&base);
         r->cancelled.store(true);
         {
             std::lock_guard<std::mutex> state(r->stateLock);
@@ -646,58 +527,8 @@ private:
         r->hRequest = nullptr;
     }
 
-    Request* Make(long* result, ICSession session, const char* url, const char* tempDir,
-                  ICCompletionCallback callback, void* context) {
-        Session* s = static_cast<Session*>(session);
-        if (result) *result = 0;
-        if (!s || !url || !*url) {
-            if (result) *result = 87;
-            return nullptr;
-        }
-        std::shared_ptr<Request> r(new (std::nothrow) Request);
-        if (!r) {
-            if (result) *result = 8;
-            return nullptr;
-        }
-        r->handle = g_nextHandle.fetch_add(1);
-        r->session = s->internet;
-        r->url = url;
-        r->tempDir = tempDir ? tempDir : "";
-        r->callback = callback;
-        r->context = context;
-        Request* raw = r.get();
-        std::lock_guard<std::mutex> guard(s->lock);
-        std::lock_guard<std::mutex> registry(m_lock);
-        for (size_t i = 0; i < s->requests.size();) {
-            Request* old = s->requests[i].get();
-            if (old->started && old->finished.load()) {
-                old->thread.join();
-                m_live.erase(old->handle);
-                s->requests.erase(s->requests.begin() + static_cast<long>(i));
-            } else {
-                ++i;
-            }
-        }
-        m_live[raw->handle] = r;
-        s->requests.push_back(std::move(r));
-        return raw;
-    }
-
-    Request* Find(ICRequest request) {
-        std::lock_guard<std::mutex> guard(m_lock);
-        auto it = m_live.find(reinterpret_cast<std::uintptr_t>(request));
-        return it == m_live.end() ? nullptr : it->second.get();
-    }
-
-    std::shared_ptr<Request> Shared(Request* r) {
-        std::lock_guard<std::mutex> guard(m_lock);
-        auto it = m_live.find(r->handle);
-        return it == m_live.end() ? nullptr : it->second;
-    }
-
-    std::mutex m_lock; // guards m_trustFile and m_live
-    std::vector<std::vector<unsigned char>> m_trustFile;
-    std::map<std::uintptr_t, std::shared_ptr<Request>> m_live;
+private:
+    std::vector<std::vector<unsigned char>> m_trustFile; // guarded by m_lock
 };
 
 } // namespace

@@ -1,6 +1,6 @@
 // The builder: statuses, line ends, escaping, CDATA, strict and lenient strings, element end tags,
 // the failed-object rule and the out-of-memory flag.
-#include "oesdk.h"
+#include "build_helpers.h"
 
 #include <gtest/gtest.h>
 
@@ -9,34 +9,7 @@
 
 namespace {
 
-// A root that writes nothing unless told to, so the builder's writers can be driven directly.
-class Probe : public OEDataObj {
-public:
-    int status = 0;
-    bool raiseMemoryFlag = false;
-    int Build(OEBuilder* builder) override {
-        if (raiseMemoryFlag) OEThreadState::SetErrorCode(OETE_OUTOFMEMORY);
-        if (status) builder->SetFailedObject(this);
-        return status;
-    }
-};
-
-std::string Text(OEBuffer& b) {
-    return std::string(b.GetBufferPtr() ? b.GetBufferPtr() : "", b.GetBufferSize());
-}
-
-// A builder bound to a fresh buffer, ready for direct writer calls.
-struct Bound {
-    OEBuffer buffer{0, 1024};
-    Probe root;
-    OEBuilder builder;
-    explicit Bound(OEBuildStringCrLfOpt crlf = OEBCL_CRLF, unsigned short endTags = 0,
-                   OEBuildStringOpt strings = OEBSO_STRICT, unsigned short xmlQuote = 0)
-        : builder(crlf, endTags) {
-        builder.Build(&buffer, &root, strings, 0, xmlQuote);
-    }
-    std::string text() { return Text(buffer); }
-};
+using namespace buildtest;
 
 TEST(Builder, BadArgumentsAndStatuses) {
     OEBuilder builder;

@@ -124,39 +124,62 @@ TEST(File, RequestFileWritesOnAfterHeaderFailureResponseFileStops) {
 
 namespace {
 
+size_t Count(const std::string& text, const std::string& what) {
+    size_t n = 0;
+    for (size_t at = text.find(what); at != std::string::npos; at = text.find(what, at + 1)) ++n;
+    return n;
+}
+
+// A part's own Build writes its header block into the part's text, and the outer file writes the
+// part's headers (MIME, then OFX) again in front of that text, so a part's OFX header block comes
+// out twice. A part given the omit-headers flag carries it once: its text is then the body alone,
+// and content-length is the size of that body.
 TEST(File, MultipartSubfilesGetTheirLengthAndType) {
-    std::unique_ptr<OEFile> outer(F()->NewFile(1));
-    outer->SetBoundary(OEString("XYZ"));
-    outer->SetMIMEBody(OEString("trailer"));
-    // A complete request: the part is built with the required check.
-    std::unique_ptr<OEFileRq> part(F()->NewFileRq(1));
-    part->AddDefaultOFXHeaders(1);
-    OERequest* rq = F()->NewRequest(1);
-    part->AppendRequest(rq);
-    OEMessageSetRq* signOnSet = F()->NewMessageSetRq(1);
-    signOnSet->SetType(OETAG_SIGNONMSGSRQV1);
-    rq->AppendMessageSet(signOnSet);
-    OESignOnRq* signOn = F()->NewSignOnRq(1);
-    signOn->SetDtClient(OEString("20240105"));
-    signOn->SetLanguage(OEString("ENG"));
-    signOn->SetAppId(OEString("QWIN"));
-    signOn->SetAppVer(static_cast<unsigned short>(2700));
-    signOn->SetUserKey(OEString("k"));
-    signOnSet->SetSignOnRq(signOn);
-    ASSERT_EQ(outer->AppendSubfile(part.get()), 1);
-    ASSERT_EQ(outer->GetNumberOfSubfiles(), 1);
-    EXPECT_NE(outer->GetSubfile(0), part.get()) << "the file keeps a copy";
-    int status = -1;
-    std::string text = Build(outer.get(), OEBCL_CRLF, &status);
-    EXPECT_EQ(status, OEBS_OK);
-    OEFile* stored = outer->GetSubfile(0);
-    OEString lengthName("content-length"), typeName("content-type");
-    ASSERT_NE(stored->GetMIMEHeader(&lengthName), nullptr);
-    ASSERT_NE(stored->GetMIMEHeader(&typeName), nullptr);
-    EXPECT_STREQ(stored->GetMIMEHeader(&typeName)->GetValue().c_str(), "application/x-ofx");
-    EXPECT_EQ(text.rfind("--XYZ\n", 0), 0u) << text;
-    EXPECT_NE(text.find("content-length: "), std::string::npos);
-    EXPECT_NE(text.find("trailer\n--XYZ--\n"), std::string::npos);
+    for (unsigned short omit : {0, 1}) {
+        SCOPED_TRACE(omit);
+        std::unique_ptr<OEFile> outer(F()->NewFile(1));
+        outer->SetBoundary(OEString("XYZ"));
+        outer->SetMIMEBody(OEString("trailer"));
+        // A complete request: the part is built with the required check.
+        std::unique_ptr<OEFileRq> part(F()->NewFileRq(1));
+        part->AddDefaultOFXHeaders(1);
+        part->SetOmitHeaders(omit);
+        OERequest* rq = F()->NewRequest(1);
+        part->AppendRequest(rq);
+        OEMessageSetRq* signOnSet = F()->NewMessageSetRq(1);
+        signOnSet->SetType(OETAG_SIGNONMSGSRQV1);
+        rq->AppendMessageSet(signOnSet);
+        OESignOnRq* signOn = F()->NewSignOnRq(1);
+        signOn->SetDtClient(OEString("20240105"));
+        signOn->SetLanguage(OEString("ENG"));
+        signOn->SetAppId(OEString("QWIN"));
+        signOn->SetAppVer(static_cast<unsigned short>(2700));
+        signOn->SetUserKey(OEString("k"));
+        signOnSet->SetSignOnRq(signOn);
+        ASSERT_EQ(outer->AppendSubfile(part.get()), 1);
+        ASSERT_EQ(outer->GetNumberOfSubfiles(), 1);
+        EXPECT_NE(outer->GetSubfile(0), part.get()) << "the file keeps a copy";
+        int status = -1;
+        std::string text = Build(outer.get(), OEBCL_CRLF, &status);
+        EXPECT_EQ(status, OEBS_OK);
+        OEFile* stored = outer->GetSubfile(0);
+        OEString lengthName("content-length"), typeName("content-type");
+        ASSERT_NE(stored->GetMIMEHeader(&lengthName), nullptr);
+        ASSERT_NE(stored->GetMIMEHeader(&typeName), nullptr);
+        EXPECT_STREQ(stored->GetMIMEHeader(&typeName)->GetValue().c_str(), "application/x-ofx");
+        EXPECT_EQ(text.rfind("--XYZ\n", 0), 0u) << text;
+        EXPECT_NE(text.find("trailer\n--XYZ--\n"), std::string::npos);
+        EXPECT_EQ(Count(text, "OFXHEADER:100"), omit ? 1u : 2u) << text;
+        EXPECT_EQ(Count(text, "content-length: "), 1u);
+        if (omit) {
+            // The length counts the part's body: from the blank line after its OFX headers to
+            // the end of the part.
+            size_t mimeEnd = text.find("\r\n\r\n") + 4;
+            size_t body = text.find("\r\n\r\n", mimeEnd) + 4, end = text.find("trailer\n");
+            EXPECT_STREQ(stored->GetMIMEHeader(&lengthName)->GetValue().c_str(),
+                         std::to_string(end - body).c_str());
+        }
+    }
 }
 
 TEST(File, DisconnectHandsObjectsBack) {

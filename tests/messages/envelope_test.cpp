@@ -177,6 +177,26 @@ TEST(Envelope, ParsedChildrenAreRoutedAndDuplicatesHandled) {
     EXPECT_EQ(extra, 2);
 }
 
+// A body may mix versions: each set takes its version from its own tag, whatever the file's.
+TEST(Envelope, VersionOneAndTwoSetsShareABody) {
+    const char* text = "<OFX><SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</STATUS>"
+                       "<DTSERVER>20240105<LANGUAGE>ENG</SONRS></SIGNONMSGSRSV1>"
+                       "<BANKMSGSRSV2><STMTTRNRS><TRNUID>1<STATUS><CODE>1<SEVERITY>INFO</STATUS>"
+                       "</STMTTRNRS></BANKMSGSRSV2></OFX>";
+    for (unsigned short version : {1, 2}) {
+        SCOPED_TRACE(version);
+        std::unique_ptr<OEFileRs> file(F()->NewFileRs(version));
+        ASSERT_EQ(ParseInto(text, file.get()), OEPS_OK);
+        OEResponse* rs = file->GetResponse(0);
+        ASSERT_EQ(rs->GetNumMessageSet(), 2);
+        EXPECT_EQ(rs->GetMessageSet(0)->GetMsgSetVersion(), 1);
+        EXPECT_EQ(rs->GetMessageSet(1)->GetMsgSetVersion(), 2);
+        EXPECT_EQ(rs->GetMessageSet(1)->GetNumTrans(), 1);
+        EXPECT_EQ(rs->AllRequiredPresent(), 1);
+        EXPECT_NE(BuildText(rs).find("<BANKMSGSRSV2>\n<STMTTRNRS>"), std::string::npos);
+    }
+}
+
 TEST(Status, CodeRangeAndSeverityWords) {
     struct Row {
         const char* text;

@@ -135,6 +135,54 @@ TEST(Machinery, DeepCopiesAreEqualAndIndependent) {
     EXPECT_EQ(other->DeepCopyFrom(status.get()), 0) << "another class is refused";
 }
 
+// Both sides: a copied file keeps its sign-on, the synchronisation's wrappers and the set's tag
+// that each wrapper carries, and writes the same text.
+TEST(Machinery, DeepCopiesOfSetsSyncsAndWrappersOnBothSides) {
+    const char kHead[] = "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n";
+    const std::string request =
+        std::string(kHead) +
+        "<OFX><SIGNONMSGSRQV1><SONRQ><DTCLIENT>20240105<USERID>u<USERPASS>p<LANGUAGE>ENG<FI><ORG>O</FI>"
+        "<APPID>A<APPVER>0100</SONRQ></SIGNONMSGSRQV1><BANKMSGSRQV1><STMTTRNRQ><TRNUID>1<STMTRQ>"
+        "<BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS</BANKACCTFROM></STMTRQ></STMTTRNRQ>"
+        "<INTRASYNCRQ><TOKEN>0<REJECTIFMISSING>N<BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS"
+        "</BANKACCTFROM><INTRATRNRQ><TRNUID>2</INTRATRNRQ></INTRASYNCRQ></BANKMSGSRQV1></OFX>";
+    const std::string response =
+        std::string(kHead) +
+        "<OFX><BANKMSGSRSV1><INTRASYNCRS><TOKEN>5<BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS"
+        "</BANKACCTFROM><INTRATRNRS><TRNUID>2<STATUS><CODE>0<SEVERITY>INFO</STATUS></INTRATRNRS>"
+        "</INTRASYNCRS></BANKMSGSRSV1></OFX>";
+
+    std::unique_ptr<OEFileRq> rq(F()->NewFileRq(0)), rqCopy(F()->NewFileRq(0));
+    ParseInto(request, rq.get());
+    ASSERT_EQ(rq->GetNumberOfRequest(), 1);
+    ASSERT_EQ(rqCopy->DeepCopyFrom(rq.get()), 1);
+    EXPECT_EQ(BuildText(rqCopy.get()), BuildText(rq.get()));
+    OEMessageSetRq* bankRq = rqCopy->GetRequest(0)->GetMessageSet(1);
+    ASSERT_NE(bankRq, nullptr);
+    EXPECT_NE(rqCopy->GetRequest(0)->GetMessageSet(0)->GetSignOnRq(), nullptr);
+    ASSERT_EQ(bankRq->GetNumSync(), 1);
+    ASSERT_EQ(bankRq->GetSync(0)->GetNumTrans(), 1);
+    EXPECT_EQ(bankRq->GetSync(0)->GetMsgsRqTag(), OETAG_BANKMSGSRQV1);
+    EXPECT_EQ(bankRq->GetSync(0)->GetTrans(0)->GetMsgsRqTag(), OETAG_BANKMSGSRQV1);
+    EXPECT_EQ(bankRq->GetTrans(0)->GetMsgsRqTag(), OETAG_BANKMSGSRQV1);
+
+    std::unique_ptr<OEFileRs> rs(F()->NewFileRs(0)), rsCopy(F()->NewFileRs(0));
+    ParseInto(response, rs.get());
+    ASSERT_EQ(rsCopy->DeepCopyFrom(rs.get()), 1);
+    EXPECT_EQ(BuildText(rsCopy.get()), BuildText(rs.get()));
+    OESyncRs* sync = rsCopy->GetResponse(0)->GetMessageSet(0)->GetSync(0);
+    ASSERT_NE(sync, nullptr);
+    ASSERT_EQ(sync->GetNumTrans(), 1);
+    EXPECT_EQ(sync->GetMsgsRsTag(), OETAG_BANKMSGSRSV1);
+    EXPECT_EQ(sync->GetTrans(0)->GetMsgsRsTag(), OETAG_BANKMSGSRSV1);
+    EXPECT_STREQ(sync->GetTrans(0)->GetTransUserID()->c_str(), "2");
+
+    // A file of the other side copies its headers but no bodies.
+    std::unique_ptr<OEFileRq> mixed(F()->NewFileRq(0));
+    ASSERT_EQ(mixed->DeepCopyFrom(rs.get()), 1);
+    EXPECT_EQ(mixed->GetNumberOfRequest(), 0);
+}
+
 TEST(Machinery, RequestFilesRoundTrip) {
     const char* text =
         "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n<OFX><SIGNONMSGSRQV1><SONRQ><DTCLIENT>20240105"
