@@ -63,6 +63,35 @@ TEST(Builder, EscapingCdataAndBlankValues) {
     EXPECT_EQ(blank.text(), "");
 }
 
+// Markup at every position of texts shorter and longer than one sixteen-byte scan, written into a
+// buffer that keeps growing (so both the in-place and the growing writes are taken).
+TEST(Builder, EscapingFindsMarkupAtEveryPosition) {
+    for (unsigned short quotes = 0; quotes < 2; ++quotes) {
+        Bound b(OEBCL_CRLF, 0, OEBSO_STRICT, quotes);
+        std::string expected;
+        for (size_t length = 1; length <= 40; ++length) {
+            for (size_t at = 0; at < length; ++at) {
+                for (char c : std::string("<>&\"'")) {
+                    std::string text(length, 'a');
+                    text[at] = c;
+                    const bool quote = c == '"' || c == '\'';
+                    const char* entity = c == '<'   ? "&lt;"
+                                         : c == '>' ? "&gt;"
+                                         : c == '&' ? "&amp;"
+                                         : c == '"' ? "&quot;"
+                                                    : "&apos;";
+                    std::string escaped = text;
+                    if (!quote || quotes) escaped.replace(at, 1, entity);
+                    ASSERT_EQ(b.builder.AddTagOEString(OETAG_MEMO, OEString(text.c_str())), OEBS_OK);
+                    expected += "<MEMO>" + escaped + "\n";
+                }
+            }
+        }
+        EXPECT_EQ(b.text(), expected) << "quotes " << quotes;
+    }
+    OEUtility::SetXmlQuoteMacros(0);
+}
+
 TEST(Builder, StrictAndLenientStrings) {
     std::string forty(40, 'z');
     OEString32 tooLong;
