@@ -13,6 +13,51 @@
 
 namespace {
 
+// The builder's own value writer of an enumeration, found by the keyword table a row names. Rows
+// of these enumerations are written through it, so a builder subclass that overrides, say,
+// AddBankTxType changes TRNTYPE wherever it is written; the text is the same keyword either way.
+// Rows of other enumerations (or of a list of their own, as COUPONFREQ) write their keyword.
+typedef OEBuildStatus (*OEEnumWriter)(OEBuilder* builder, unsigned short value);
+struct OEEnumWriterRow {
+    const OEKeywordTable* m_table;
+    OEEnumWriter m_write;
+};
+#define OE_BY_VALUE(op, Type) [](OEBuilder* b, unsigned short v) { return b->op(static_cast<Type>(v)); }
+#define OE_BY_REF(op, Type)                                                                                  \
+    [](OEBuilder* b, unsigned short v) {                                                                     \
+        const Type value = static_cast<Type>(v);                                                             \
+        return b->op(value);                                                                                 \
+    }
+const OEEnumWriterRow kEnumWriters[] = {
+    // The transaction type first: it is the one in every statement line.
+    {&OEKW_BANKTXTYPE, OE_BY_VALUE(AddBankTxType, OEBankTxType)},
+    {&OEKW_CORRECTACTION, OE_BY_VALUE(AddBankAction, OEBankAction)},
+    {&OEKW_BANKACCOUNTTYPE, OE_BY_VALUE(AddBankAccountType, OEBankAccountType)},
+    {&OEKW_OFXSECURITY, OE_BY_VALUE(AddOFXSecurity, OEOFXSecurity)},
+    {&OEKW_SYNCMODE, OE_BY_VALUE(AddSyncMode, OESyncMode)},
+    {&OEKW_CHARTYPE, OE_BY_VALUE(AddCharacterType, OECharacterType)},
+    {&OEKW_CLIENTROUTING, OE_BY_VALUE(AddClientRouting, OEClientRouting)},
+    {&OEKW_BALTYPE, OE_BY_REF(AddBalType, OEBalType)},
+    {&OEKW_ASSETCLASS, OE_BY_REF(AddAssetClass, OEAssetClass)},
+    {&OEKW_DEBTTYPE, OE_BY_REF(AddDebtType, OEDebtType)},
+    {&OEKW_DEBTCLASS, OE_BY_REF(AddDebtClass, OEDebtClass)},
+    {&OEKW_CALLTYPE, OE_BY_REF(AddCallType, OECallType)},
+    {&OEKW_MFTYPE, OE_BY_REF(AddMFType, OEMFType)},
+    {&OEKW_STOCKTYPE, OE_BY_REF(AddStockType, OEStockType)},
+};
+#undef OE_BY_VALUE
+#undef OE_BY_REF
+
+OEEnumWriter EnumWriterFor(const OEKeywordTable* table) {
+    for (const OEEnumWriterRow& row : kEnumWriters)
+        if (row.m_table == table) return row.m_write;
+    return nullptr;
+}
+
+} // namespace
+
+namespace {
+
 // Case-insensitive keyword match over a table; the index or -1.
 inline char UpperAscii(char c) {
     return (c >= 'a' && c <= 'z') ? static_cast<char>(c - 32) : c;
@@ -680,7 +725,13 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
     case OEFK_ENUM: {
         unsigned short value = *static_cast<const unsigned short*>(slot);
         if (!row->m_keywords || value >= row->m_keywords->m_count) return Fail(builder, OEBS_NOTEXTFORM);
-        status = builder->AddTagOEKeyword(tag, row->m_keywords->m_words[value]);
+        if (OEEnumWriter write = EnumWriterFor(row->m_keywords)) {
+            status = builder->AddTagElement(tag);
+            if (status == OEBS_OK) status = write(builder, value);
+            if (status == OEBS_OK && builder->GetElemEndTags() == 1) status = builder->AddTagElementEnd(tag);
+        } else {
+            status = builder->AddTagOEKeyword(tag, row->m_keywords->m_words[value]);
+        }
         break;
     }
     case OEFK_BOOL:
