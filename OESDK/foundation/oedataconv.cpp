@@ -241,6 +241,7 @@ OE_KEYWORD_TABLE(OEKW_BANKTXTYPE, kBankTxTable)
 
 const char* const kBuyTypeTable[] = {"BUY", "BUYTOCOVER"};
 OE_KEYWORD_PAIR(OEDataConversion, BuyType, OEBuyType, 0, kBuyTypeTable)
+OE_KEYWORD_TABLE(OEKW_BUYTYPE, kBuyTypeTable)
 
 const char* const kCallTypeTable[] = {"CALL", "PUT", "PREFUND", "MATURITY"};
 OE_KEYWORD_PAIR(OEDataConversion, CallType, OECallType, 0, kCallTypeTable)
@@ -295,6 +296,7 @@ OE_KEYWORD_PAIR(OEDataConversion, HeaderTag, OEHeaderTag, 2, kHeaderTagTable)
 
 const char* const kIncomeTypeTable[] = {"CGLONG", "CGSHORT", "DIV", "INTEREST", "MISC"};
 OE_KEYWORD_PAIR(OEDataConversion, IncomeType, OEIncomeType, 0, kIncomeTypeTable)
+OE_KEYWORD_TABLE(OEKW_INCOMETYPE, kIncomeTypeTable)
 
 const char* const kInvAcctTypeTable[] = {"INDIVIDUAL", "JOINT", "TRUST", "CORPORATE"};
 OE_KEYWORD_PAIR(OEDataConversion, InvAcctType, OEInvAcctType, 0, kInvAcctTypeTable)
@@ -324,12 +326,15 @@ OE_KEYWORD_TABLE(OEKW_OFXSECURITY, kOFXSecurityTable)
 
 const char* const kOptActionTable[] = {"EXERCISE", "ASSIGN", "EXPIRE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptAction, OEOptAction, 0, kOptActionTable)
+OE_KEYWORD_TABLE(OEKW_OPTACTION, kOptActionTable)
 
 const char* const kOptBuyTypeTable[] = {"BUYTOOPEN", "BUYTOCLOSE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptBuyType, OEOptBuyType, 0, kOptBuyTypeTable)
+OE_KEYWORD_TABLE(OEKW_OPTBUYTYPE, kOptBuyTypeTable)
 
 const char* const kOptSellTypeTable[] = {"SELLTOOPEN", "SELLTOCLOSE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptSellType, OEOptSellType, 0, kOptSellTypeTable)
+OE_KEYWORD_TABLE(OEKW_OPTSELLTYPE, kOptSellTypeTable)
 
 const char* const kOptTypeTable[] = {"PUT", "CALL", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, OptType, OEOptType, 0, kOptTypeTable)
@@ -339,6 +344,7 @@ OE_KEYWORD_PAIR(OEDataConversion, PayeeIDScope, OEPayeeIDScope, 0, kPayeeIDScope
 
 const char* const kPosTypeTable[] = {"LONG", "SHORT"};
 OE_KEYWORD_PAIR(OEDataConversion, PosType, OEPosType, 0, kPosTypeTable)
+OE_KEYWORD_TABLE(OEKW_POSTYPE, kPosTypeTable)
 
 const char* const kProcCodeTable[] = {"WILLPROCESSON", "POSTEDON", "PROCESSEDON",
                                       "NOFUNDSON",     "FAILEDON", "CANCELEDON"};
@@ -346,18 +352,22 @@ OE_KEYWORD_PAIR(OEDataConversion, ProcCode, OEProcCode, 0, kProcCodeTable)
 
 const char* const kRelTypeTable[] = {"SPREAD", "STRADDLE", "NONE", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, RelType, OERelType, 0, kRelTypeTable)
+OE_KEYWORD_TABLE(OEKW_RELTYPE, kRelTypeTable)
 
 const char* const kRestrictionTable[] = {"ALLORNONE", "MINUNITS", "NONE"};
 OE_KEYWORD_PAIR(OEDataConversion, Restriction, OERestriction, 0, kRestrictionTable)
 
 const char* const kSecuredTable[] = {"NAKED", "COVERED"};
 OE_KEYWORD_PAIR(OEDataConversion, Secured, OESecured, 0, kSecuredTable)
+OE_KEYWORD_TABLE(OEKW_SECURED, kSecuredTable)
 
 const char* const kSellReasonTable[] = {"CALL", "SELL", "MATURITY"};
 OE_KEYWORD_PAIR(OEDataConversion, SellReason, OESellReason, 0, kSellReasonTable)
+OE_KEYWORD_TABLE(OEKW_SELLREASON, kSellReasonTable)
 
 const char* const kSellTypeTable[] = {"SELL", "SELLSHORT"};
 OE_KEYWORD_PAIR(OEDataConversion, SellType, OESellType, 0, kSellTypeTable)
+OE_KEYWORD_TABLE(OEKW_SELLTYPE, kSellTypeTable)
 
 const char* const kServiceTable[] = {"BANKSVC", "BPSVC", "INVSVC"};
 OE_KEYWORD_PAIR(OEDataConversion, Service, OEService, 0, kServiceTable)
@@ -381,6 +391,7 @@ OE_KEYWORD_TABLE(OEKW_STOCKTYPE, kStockTypeTable)
 
 const char* const kSubAcctTable[] = {"CASH", "MARGIN", "SHORT", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, SubAcct, OESubAcct, 0, kSubAcctTable)
+OE_KEYWORD_TABLE(OEKW_SUBACCT, kSubAcctTable)
 
 const char* const kSyncModeTable[] = {"FULL", "LITE"};
 OE_KEYWORD_PAIR(OEDataConversion, SyncMode, OESyncMode, 0, kSyncModeTable)
@@ -388,6 +399,7 @@ OE_KEYWORD_TABLE(OEKW_SYNCMODE, kSyncModeTable)
 
 const char* const kTferActionTable[] = {"IN", "OUT"};
 OE_KEYWORD_PAIR(OEDataConversion, TferAction, OETferAction, 0, kTferActionTable)
+OE_KEYWORD_TABLE(OEKW_TFERACTION, kTferActionTable)
 
 const char* const kUSProductTypeTable[] = {"401K",   "403B",   "IRA", "KEOGH", "OTHER", "SARSEP",
                                            "SIMPLE", "NORMAL", "TDA", "TRUST", "UGMA"};

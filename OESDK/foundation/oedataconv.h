@@ -44,6 +44,18 @@ extern OE_API const OEKeywordTable OEKW_DEBTCLASS;        // "TREASURY" ... "OTH
 extern OE_API const OEKeywordTable OEKW_CALLTYPE;         // "CALL", "PUT", "PREFUND", "MATURITY"
 extern OE_API const OEKeywordTable OEKW_MFTYPE;           // "OPENEND", "CLOSEEND", "OTHER"
 extern OE_API const OEKeywordTable OEKW_STOCKTYPE;        // "COMMON" ... "OTHER"
+extern OE_API const OEKeywordTable OEKW_BUYTYPE;          // "BUY", "BUYTOCOVER"
+extern OE_API const OEKeywordTable OEKW_INCOMETYPE;       // "CGLONG" ... "MISC"
+extern OE_API const OEKeywordTable OEKW_OPTACTION;        // "EXERCISE", "ASSIGN", "EXPIRE"
+extern OE_API const OEKeywordTable OEKW_OPTBUYTYPE;       // "BUYTOOPEN", "BUYTOCLOSE"
+extern OE_API const OEKeywordTable OEKW_OPTSELLTYPE;      // "SELLTOOPEN", "SELLTOCLOSE"
+extern OE_API const OEKeywordTable OEKW_POSTYPE;          // "LONG", "SHORT"
+extern OE_API const OEKeywordTable OEKW_RELTYPE;          // "SPREAD", "STRADDLE", "NONE", "OTHER"
+extern OE_API const OEKeywordTable OEKW_SECURED;          // "NAKED", "COVERED"
+extern OE_API const OEKeywordTable OEKW_SELLREASON;       // "CALL", "SELL", "MATURITY"
+extern OE_API const OEKeywordTable OEKW_SELLTYPE;         // "SELL", "SELLSHORT"
+extern OE_API const OEKeywordTable OEKW_SUBACCT;          // "CASH", "MARGIN", "SHORT", "OTHER"
+extern OE_API const OEKeywordTable OEKW_TFERACTION;       // "IN", "OUT"
 
 class OE_API OEDataConversion {
 public:

@@ -854,8 +854,14 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
     DeleteChildren();
-    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
-        const OEFieldRow* row = &d.m_fields[i];
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (!CopyRow(&d.m_fields[i], other, factory)) return 0;
+    if (!CopyExtraFrom(other)) return 0;
+    return CopyBaseMembersFrom(other);
+}
+
+unsigned short OEAggregate::CopyRow(const OEFieldRow* row, const OEAggregate* other, OEDataObjFactory* factory) {
+    {
         void* to = Slot(row);
         const void* from = other->Slot(row);
         switch (row->m_kind) {
@@ -912,8 +918,7 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
         }
         }
     }
-    if (!CopyExtraFrom(other)) return 0;
-    return CopyBaseMembersFrom(other);
+    return 1;
 }
 
 unsigned short OEAggregate::CopyExtraFrom(const OEAggregate*) {
@@ -999,4 +1004,63 @@ unsigned short OEAggregate::GetFieldText(const OEFieldRow* row, OEString& out) c
     }
     out = number;
     return 1;
+}
+
+// ---------------------------------------------------------------- OEMixedList
+
+int OEMixedList::Build(OEBuilder* builder) {
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
+        if (d.m_fields[i].m_kind == OEFK_LIST) continue;
+        OEBuildStatus status = BuildRow(builder, &d.m_fields[i]);
+        if (status != 0) return status;
+    }
+    return BuildEach(this, builder, m_entries);
+}
+
+// The rows besides the lists are elements, so the entries are the only children.
+OEDataObj* OEMixedList::GetChild(unsigned short index) const {
+    return m_entries.Get(index);
+}
+
+unsigned short OEMixedList::GetNumberOfChildren() const {
+    return m_entries.Entries();
+}
+
+unsigned short OEMixedList::DeepCopyFrom(const OEAggregate* other) {
+    if (!other || other == this) return other ? 1 : 0;
+    if (&other->Describe() != &Describe()) return 0;
+    OEDataObjFactory* factory = GetFactory();
+    if (!factory) return 0;
+    m_entries.DeleteAll();
+    const OEMixedList* from = static_cast<const OEMixedList*>(other);
+    for (unsigned short k = 0; k < from->m_entries.Entries(); ++k) {
+        const OEAggregate* source = static_cast<const OEAggregate*>(from->m_entries.Get(k));
+        const OEFieldRow* row = source ? FindRow(source->GetType()) : nullptr;
+        if (!row || row->m_kind != OEFK_LIST) continue; // nothing to copy, or not a kind this list makes
+        OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, source->GetMsgSetVersion()));
+        if (!copy) return 0;
+        if (!m_entries.Append(copy)) {
+            delete copy;
+            return 0;
+        }
+        if (!copy->DeepCopyFrom(source)) return 0;
+    }
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (d.m_fields[i].m_kind != OEFK_LIST && !CopyRow(&d.m_fields[i], other, factory)) return 0;
+    return CopyBaseMembersFrom(other);
+}
+
+unsigned short OEMixedList::AppendEntry(OEDataObj* entry) {
+    const OEFieldRow* row = entry ? FindRow(entry->GetType()) : nullptr;
+    if (!row || row->m_kind != OEFK_LIST) return 0;
+    return AppendToList(entry->GetType(), entry);
+}
+
+void OEMixedList::DeleteAllEntries() {
+    m_entries.DeleteAll();
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+        if (d.m_fields[i].m_kind == OEFK_LIST && ValidateTag(d.m_fields[i].m_tag)) ClearTag(d.m_fields[i].m_tag);
 }

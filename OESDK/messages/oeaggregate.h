@@ -196,6 +196,9 @@ protected:
     OEParseStatus StartChild(const OEFieldRow* row, const OETagDictionaryEntry* entry);
     // Deletes every child and list element.
     void DeleteChildren();
+    // Copies one row's value (a child or list as deep copies made by the factory) from other, an
+    // object of the same class; 0 when memory is short.
+    unsigned short CopyRow(const OEFieldRow* row, const OEAggregate* other, OEDataObjFactory* factory);
 
 private:
     // One probe of the descriptor's index: the field row of `tag` (or null) and the presence bit
@@ -216,6 +219,29 @@ public:
                                         OETagID tag);
     // Writes every object of `list` in order; the first failure is recorded against `parent`.
     static int BuildEach(OEDataObj* parent, OEBuilder* builder, const OEDataObjList& list);
+};
+
+// An aggregate whose list rows all share one list (m_entries), so that entries of different kinds
+// are written back in the order read: the security list, the investment transaction and position
+// lists. Its element and child rows, if any, are written first, in field order, then every entry
+// as its own kind; the child walk and DeepCopyFrom see each entry once.
+class OE_API OEMixedList : public OEAggregate {
+public:
+    explicit OEMixedList(unsigned short version = 0) : OEAggregate(version) {}
+    int Build(OEBuilder* builder) override;
+    OEDataObj* GetChild(unsigned short index) const override;
+    unsigned short GetNumberOfChildren() const override;
+    unsigned short DeepCopyFrom(const OEAggregate* other) override;
+
+protected:
+    // Appends an entry of any kind the list has a row for; 0 for null or another kind (the
+    // caller keeps it).
+    unsigned short AppendEntry(OEDataObj* entry);
+    // Deletes every entry and clears the marks of the list rows.
+    void DeleteAllEntries();
+
+public:
+    OEDataObjList m_entries;
 };
 
 #endif

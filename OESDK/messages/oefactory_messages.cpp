@@ -11,6 +11,7 @@
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
 #include "messages/oeseclist.h"
+#include "messages/oeinvest.h"
 
 OEFile* OEDataObjFactory::NewFile(unsigned short version) {
     return Create<OEFile>(version);
@@ -212,4 +213,119 @@ OESecListRs* OEDataObjFactory::NewSecListRs(unsigned short version) {
 }
 OESecListRq* OEDataObjFactory::NewSecListRq(unsigned short version) {
     return Create<OESecListRq>(version);
+}
+
+OEInvAcctFrom* OEDataObjFactory::NewInvAcctFrom(unsigned short version) {
+    return Create<OEInvAcctFrom>(version);
+}
+OEBalList* OEDataObjFactory::NewBalList(unsigned short version) {
+    return Create<OEBalList>(version);
+}
+OEPosDebt* OEDataObjFactory::NewPosDebt(unsigned short version) {
+    return Create<OEPosDebt>(version);
+}
+OEPosMF* OEDataObjFactory::NewPosMF(unsigned short version) {
+    return Create<OEPosMF>(version);
+}
+OEPosOpt* OEDataObjFactory::NewPosOpt(unsigned short version) {
+    return Create<OEPosOpt>(version);
+}
+OEPosOther* OEDataObjFactory::NewPosOther(unsigned short version) {
+    return Create<OEPosOther>(version);
+}
+OEPosStock* OEDataObjFactory::NewPosStock(unsigned short version) {
+    return Create<OEPosStock>(version);
+}
+OEInvPos* OEDataObjFactory::NewInvPos(unsigned short version) {
+    return Create<OEInvPos>(version);
+}
+OEIncPos* OEDataObjFactory::NewIncPos(unsigned short version) {
+    return Create<OEIncPos>(version);
+}
+OEInvBal* OEDataObjFactory::NewInvBal(unsigned short version) {
+    return Create<OEInvBal>(version);
+}
+OEInvBankTran* OEDataObjFactory::NewInvBankTran(unsigned short version) {
+    return Create<OEInvBankTran>(version);
+}
+OEInvBuy* OEDataObjFactory::NewInvBuy(unsigned short version) {
+    return Create<OEInvBuy>(version);
+}
+OEInvSell* OEDataObjFactory::NewInvSell(unsigned short version) {
+    return Create<OEInvSell>(version);
+}
+OEInvPosList* OEDataObjFactory::NewInvPosList(unsigned short version) {
+    return Create<OEInvPosList>(version);
+}
+OEInvStmtRq* OEDataObjFactory::NewInvStmtRq(unsigned short version) {
+    return Create<OEInvStmtRq>(version);
+}
+OEInvStmtRs* OEDataObjFactory::NewInvStmtRs(unsigned short version) {
+    return Create<OEInvStmtRs>(version);
+}
+OEInvTran* OEDataObjFactory::NewInvTran(unsigned short version) {
+    return Create<OEInvTran>(version);
+}
+OEInvTranList* OEDataObjFactory::NewInvTranList(unsigned short version) {
+    return Create<OEInvTranList>(version);
+}
+OEBuyStock* OEDataObjFactory::NewBuyStock(unsigned short version) {
+    return Create<OEBuyStock>(version);
+}
+OEBuyMF* OEDataObjFactory::NewBuyMF(unsigned short version) {
+    return Create<OEBuyMF>(version);
+}
+OEBuyOpt* OEDataObjFactory::NewBuyOpt(unsigned short version) {
+    return Create<OEBuyOpt>(version);
+}
+OEBuyDebt* OEDataObjFactory::NewBuyDebt(unsigned short version) {
+    return Create<OEBuyDebt>(version);
+}
+OEBuyOther* OEDataObjFactory::NewBuyOther(unsigned short version) {
+    return Create<OEBuyOther>(version);
+}
+OESellStock* OEDataObjFactory::NewSellStock(unsigned short version) {
+    return Create<OESellStock>(version);
+}
+OESellMF* OEDataObjFactory::NewSellMF(unsigned short version) {
+    return Create<OESellMF>(version);
+}
+OESellDebt* OEDataObjFactory::NewSellDebt(unsigned short version) {
+    return Create<OESellDebt>(version);
+}
+OESellOpt* OEDataObjFactory::NewSellOpt(unsigned short version) {
+    return Create<OESellOpt>(version);
+}
+OESellOther* OEDataObjFactory::NewSellOther(unsigned short version) {
+    return Create<OESellOther>(version);
+}
+OEIncome* OEDataObjFactory::NewIncome(unsigned short version) {
+    return Create<OEIncome>(version);
+}
+OEJrnlFund* OEDataObjFactory::NewJrnlFund(unsigned short version) {
+    return Create<OEJrnlFund>(version);
+}
+OEJrnlSec* OEDataObjFactory::NewJrnlSec(unsigned short version) {
+    return Create<OEJrnlSec>(version);
+}
+OEMarginInterest* OEDataObjFactory::NewMarginInterest(unsigned short version) {
+    return Create<OEMarginInterest>(version);
+}
+OEReinvest* OEDataObjFactory::NewReinvest(unsigned short version) {
+    return Create<OEReinvest>(version);
+}
+OERetOfCap* OEDataObjFactory::NewRetOfCap(unsigned short version) {
+    return Create<OERetOfCap>(version);
+}
+OESplit* OEDataObjFactory::NewSplit(unsigned short version) {
+    return Create<OESplit>(version);
+}
+OETransfer* OEDataObjFactory::NewTransfer(unsigned short version) {
+    return Create<OETransfer>(version);
+}
+OEClosureOpt* OEDataObjFactory::NewClosureOpt(unsigned short version) {
+    return Create<OEClosureOpt>(version);
+}
+OEInvExpense* OEDataObjFactory::NewInvExpense(unsigned short version) {
+    return Create<OEInvExpense>(version);
 }

@@ -164,11 +164,11 @@ const OETagRow kSecListValid[] = {{OETAG_DEBTINFO, OEVM_ALL, 0},
                                   {OETAG_OTHERINFO, OEVM_ALL, 0},
                                   {OETAG_STOCKINFO, OEVM_ALL, 0}};
 const OEFieldRow kSecListFields[] = {
-    {OETAG_DEBTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewDebtInfo)},
-    {OETAG_MFINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewMFInfo)},
-    {OETAG_OPTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewOptInfo)},
-    {OETAG_OTHERINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewOtherInfo)},
-    {OETAG_STOCKINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewStockInfo)},
+    {OETAG_DEBTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewDebtInfo)},
+    {OETAG_MFINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewMFInfo)},
+    {OETAG_OPTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewOptInfo)},
+    {OETAG_OTHERINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewOtherInfo)},
+    {OETAG_STOCKINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewStockInfo)},
 };
 
 // ---- SECRQ, SECLISTRQ, SECLISTRS ----
@@ -224,7 +224,7 @@ OE_SECLIST_CLASS(OEMFInfo, OESecurityInfo, kMFDesc, OETAG_MFINFO)
 OE_SECLIST_CLASS(OEOptInfo, OESecurityInfo, kOptDesc, OETAG_OPTINFO)
 OE_SECLIST_CLASS(OEOtherInfo, OESecurityInfo, kOtherDesc, OETAG_OTHERINFO)
 OE_SECLIST_CLASS(OEStockInfo, OESecurityInfo, kStockDesc, OETAG_STOCKINFO)
-OE_SECLIST_CLASS(OESecList, OEAggregate, kSecListDesc, OETAG_SECLIST)
+OE_SECLIST_CLASS(OESecList, OEMixedList, kSecListDesc, OETAG_SECLIST)
 OE_SECLIST_CLASS(OESecRq, OEAggregate, kSecRqDesc, OETAG_SECRQ)
 OE_SECLIST_CLASS(OESecListRq, OETransBase, kSecListRqDesc, OETAG_SECLISTRQ)
 OE_SECLIST_CLASS(OESecListRs, OETransBase, kSecListRsDesc, OETAG_SECLISTRS)
@@ -234,43 +234,4 @@ OECouponFreq OEDebtInfo::GetCouponFreq() const {
     if (v == 5) return OECF_SEMIANNUAL; // "SEMIANNUALLY"
     if (v == 6) return OECF_ANNUAL;     // "ANUALLY"
     return static_cast<OECouponFreq>(v);
-}
-
-// ---------------------------------------------------------------- OESecList
-
-int OESecList::Build(OEBuilder* builder) {
-    return BuildEach(this, builder, m_securities);
-}
-
-unsigned short OESecList::DeepCopyFrom(const OEAggregate* other) {
-    if (!other || other == this) return other ? 1 : 0;
-    if (&other->Describe() != &Describe()) return 0;
-    OEDataObjFactory* factory = GetFactory();
-    if (!factory) return 0;
-    m_securities.DeleteAll();
-    const OEDataObjList& from = static_cast<const OESecList*>(other)->m_securities;
-    for (unsigned short k = 0; k < from.Entries(); ++k) {
-        const OEAggregate* source = static_cast<const OEAggregate*>(from.Get(k));
-        const OEFieldRow* row = source ? FindRow(source->GetType()) : nullptr;
-        if (!row) continue; // nothing to copy, or not a kind this list can make
-        OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, source->GetMsgSetVersion()));
-        if (!copy) return 0;
-        if (!m_securities.Append(copy)) {
-            delete copy;
-            return 0;
-        }
-        if (!copy->DeepCopyFrom(source)) return 0;
-    }
-    return CopyBaseMembersFrom(other);
-}
-
-unsigned short OESecList::AppendSecurity(OESecurityInfo* info) {
-    if (!info || !FindRow(info->GetType())) return 0;
-    return AppendToList(info->GetType(), info);
-}
-
-void OESecList::DeleteAllSecurity() {
-    m_securities.DeleteAll();
-    for (const OETagRow& row : kSecListValid)
-        if (ValidateTag(row.m_tag)) ClearTag(row.m_tag);
 }

@@ -292,27 +292,20 @@ public:
 
 // SECLIST: any number of security descriptions of the five kinds, kept in one list in the order
 // they were read or appended, and written back in that order (a file may mix the kinds freely).
-class OE_API OESecList : public OEAggregate {
+class OE_API OESecList : public OEMixedList {
 public:
     explicit OESecList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    // One list for five rows: written, walked and copied once, each entry as its own kind.
-    int Build(OEBuilder* builder) override;
-    OEDataObj* GetChild(unsigned short index) const override { return m_securities.Get(index); }
-    unsigned short GetNumberOfChildren() const override { return m_securities.Entries(); }
-    unsigned short DeepCopyFrom(const OEAggregate* other) override;
 
     // Appends a description of any of the five kinds (its own tag says which); the list owns it.
     // 0 for null or for an object of another kind (the caller keeps it).
-    unsigned short AppendSecurity(OESecurityInfo* info);
+    unsigned short AppendSecurity(OESecurityInfo* info) { return AppendEntry(info); }
     OESecurityInfo* GetSecurity(unsigned short index) const {
-        return static_cast<OESecurityInfo*>(m_securities.Get(index));
+        return static_cast<OESecurityInfo*>(m_entries.Get(index));
     }
-    unsigned short GetNumSecurity() const { return m_securities.Entries(); }
+    unsigned short GetNumSecurity() const { return m_entries.Entries(); }
     // Deletes every entry and clears the five marks.
-    void DeleteAllSecurity();
-
-    OEDataObjList m_securities;
+    void DeleteAllSecurity() { DeleteAllEntries(); }
 };
 
 // SECRQ: one security asked for, by exactly one of SECID, TICKER and FIID.

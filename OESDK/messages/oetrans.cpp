@@ -9,6 +9,7 @@
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
 #include "messages/oeseclist.h"
+#include "messages/oeinvest.h"
 #include "messages/oesignon.h"
 
 #include <cstdlib>
@@ -153,6 +154,7 @@ const OEFieldRow kTransRqFields[] = {
     {OETAG_CHALLENGERQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewChallengeRq)},
     {OETAG_PROFRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewProfileRq)},
     {OETAG_SECLISTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewSecListRq)},
+    {OETAG_INVSTMTRQ, OEFK_CHILD, OE_MEMBER(OETransRq, m_actual), nullptr, OE_MAKE(NewInvStmtRq)},
 };
 
 // ---- transaction response wrapper ----
@@ -171,6 +173,7 @@ const OEFieldRow kTransRsFields[] = {
     {OETAG_CHALLENGERS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewChallengeRs)},
     {OETAG_PROFRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewProfileRs)},
     {OETAG_SECLISTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewSecListRs)},
+    {OETAG_INVSTMTRS, OEFK_CHILD, OE_MEMBER(OETransRs, m_actual), nullptr, OE_MAKE(NewInvStmtRs)},
 };
 
 // ---- STATUS ----

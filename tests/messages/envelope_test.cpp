@@ -289,7 +289,7 @@ TEST(TransactionWrappers, InnerTagsWithoutAClassAnswerFour) {
     std::unique_ptr<OEFileRs> rs(F()->NewFileRs(1));
     OEParseStatus status =
         ParseInto("<OFX><INVSTMTMSGSRSV1><INVSTMTTRNRS><TRNUID>1<STATUS><CODE>0<SEVERITY>INFO"
-                  "</STATUS><INVSTMTRS><CURDEF>USD</INVSTMTRS></INVSTMTTRNRS></INVSTMTMSGSRSV1></OFX>",
+                  "</STATUS><INVMAILRS><INVACCTFROM></INVMAILRS></INVSTMTTRNRS></INVSTMTMSGSRSV1></OFX>",
                   rs.get());
     EXPECT_EQ(status, OEPS_INVALID);
 }

@@ -1,0 +1,500 @@
+#include "messages/oeinvest.h"
+
+namespace {
+
+// One valid row (every version, V1 only, after V1) and one field row per kind.
+#define V(T)                                                                                                 \
+    { OETAG_##T, OEVM_ALL, 0 }
+#define V1(T)                                                                                                \
+    { OETAG_##T, OEVM_V1, 0 }
+#define V2(T)                                                                                                \
+    { OETAG_##T, OEVM_NOTV1, 0 }
+#define TEXT(C, T, m)                                                                                        \
+    { OETAG_##T, OEFK_TEXT, OE_MEMBER(C, m), nullptr, nullptr }
+#define AMT(C, T, m)                                                                                         \
+    { OETAG_##T, OEFK_AMOUNT, OE_MEMBER(C, m), nullptr, nullptr }
+#define DATE(C, T, m)                                                                                        \
+    { OETAG_##T, OEFK_DATETIME, OE_MEMBER(C, m), nullptr, nullptr }
+#define FLAG(C, T, m)                                                                                        \
+    { OETAG_##T, OEFK_BOOL, OE_MEMBER(C, m), nullptr, nullptr }
+#define COUNT(C, T, m)                                                                                       \
+    { OETAG_##T, OEFK_ULONG, OE_MEMBER(C, m), nullptr, nullptr }
+#define ENUM(C, T, m, kw)                                                                                    \
+    { OETAG_##T, OEFK_ENUM, OE_MEMBER(C, m), &kw, nullptr }
+#define CHILD(C, T, m, op)                                                                                   \
+    { OETAG_##T, OEFK_CHILD, OE_MEMBER(C, m), nullptr, OE_MAKE(op) }
+#define ENTRY(C, T, op)                                                                                      \
+    { OETAG_##T, OEFK_LIST, OE_MEMBER(C, m_entries), nullptr, OE_MAKE(op) }
+#define CURRENCIES(C)                                                                                        \
+    CHILD(C, CURRENCY, m_currency, NewCurrency), CHILD(C, ORIGCURRENCY, m_currency, NewCurrency)
+#define HEAD(C) CHILD(C, INVTRAN, m_invTran, NewInvTran), CHILD(C, SECID, m_secId, NewSecID)
+
+// ---- INVACCTFROM, INCPOS, INVSTMTRQ ----
+const OETagRow kAcctValid[] = {V(BROKERID), V(ACCTID)};
+const OEFieldRow kAcctFields[] = {TEXT(OEInvAcctFrom, BROKERID, m_brokerId),
+                                  TEXT(OEInvAcctFrom, ACCTID, m_acctId)};
+const OETagRow kIncPosValid[] = {V(DTASOF), V(INCLUDE)};
+const OETagRow kIncPosRequired[] = {V(INCLUDE)};
+const OEFieldRow kIncPosFields[] = {DATE(OEIncPos, DTASOF, m_dtAsOf), FLAG(OEIncPos, INCLUDE, m_include)};
+const OETagRow kRqValid[] = {
+    V(INVACCTFROM), V(INCTRAN), V(INCOO), V(INCPOS), V(INCBAL),
+};
+const OETagRow kRqRequired[] = {V(INVACCTFROM), V(INCOO), V(INCPOS), V(INCBAL)};
+const OEFieldRow kRqFields[] = {
+    CHILD(OEInvStmtRq, INVACCTFROM, m_account, NewInvAcctFrom),
+    CHILD(OEInvStmtRq, INCTRAN, m_incTran, NewIncTransaction),
+    FLAG(OEInvStmtRq, INCOO, m_incOO),
+    CHILD(OEInvStmtRq, INCPOS, m_incPos, NewIncPos),
+    FLAG(OEInvStmtRq, INCBAL, m_incBal),
+};
+
+// ---- INVSTMTRS ----
+// INVOOLIST has its place in the valid rows (and its member) ahead of its field row.
+const OETagRow kRsValid[] = {V(DTASOF),     V(CURDEF), V(INVACCTFROM), V(INVTRANLIST),
+                             V(INVPOSLIST), V(INVBAL), V(INVOOLIST),   V(MKTGINFO)};
+const OETagRow kRsRequired[] = {V(DTASOF), V(CURDEF), V(INVACCTFROM)};
+const OEFieldRow kRsFields[] = {
+    DATE(OEInvStmtRs, DTASOF, m_dtAsOf),
+    TEXT(OEInvStmtRs, CURDEF, m_curDef),
+    CHILD(OEInvStmtRs, INVACCTFROM, m_account, NewInvAcctFrom),
+    CHILD(OEInvStmtRs, INVTRANLIST, m_tranList, NewInvTranList),
+    CHILD(OEInvStmtRs, INVPOSLIST, m_posList, NewInvPosList),
+    CHILD(OEInvStmtRs, INVBAL, m_invBal, NewInvBal),
+    TEXT(OEInvStmtRs, MKTGINFO, m_mktgInfo),
+};
+
+// ---- INVTRAN ----
+const OETagRow kTranValid[] = {V(FITID),    V1(SRVRTID),      V2(SRVRTID2), V(DTTRADE),
+                               V(DTSETTLE), V(REVERSALFITID), V1(MEMO),     V2(MEMO2)};
+const OETagRow kTranRequired[] = {V(FITID), V(DTTRADE)};
+const OEFieldRow kTranFields[] = {
+    TEXT(OEInvTran, FITID, m_fitId),       TEXT(OEInvTran, SRVRTID, m_srvrTid),
+    TEXT(OEInvTran, SRVRTID2, m_srvrTid2), DATE(OEInvTran, DTTRADE, m_dtTrade),
+    DATE(OEInvTran, DTSETTLE, m_dtSettle), TEXT(OEInvTran, REVERSALFITID, m_reversalFitId),
+    TEXT(OEInvTran, MEMO, m_memo),         TEXT(OEInvTran, MEMO2, m_memo2),
+};
+
+// ---- INVBANKTRAN ----
+const OETagRow kBankTranValid[] = {V(STMTTRN), V(SUBACCTFUND)};
+const OEFieldRow kBankTranFields[] = {CHILD(OEInvBankTran, STMTTRN, m_stmtTrn, NewBankStatementTx),
+                                      ENUM(OEInvBankTran, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT)};
+
+// ---- INVBUY, INVSELL ----
+const OETagRow kBuyValid[] = {
+    V(INVTRAN),  V(SECID),        V(UNITS),      V(UNITPRICE),   V(MARKUP),        V(COMMISSION),
+    V(TAXES),    V(FEES),         V(LOAD),       V(TOTAL),       V2(REVERSALFEES), V2(REVERSALFITID),
+    V(CURRENCY), V(ORIGCURRENCY), V(SUBACCTSEC), V(SUBACCTFUND),
+};
+const OETagRow kTradeRequired[] = {V(INVTRAN), V(SECID),      V(UNITS),      V(UNITPRICE),
+                                   V(TOTAL),   V(SUBACCTSEC), V(SUBACCTFUND)};
+const OEFieldRow kBuyFields[] = {
+    HEAD(OEInvBuy),
+    AMT(OEInvBuy, UNITS, m_units),
+    AMT(OEInvBuy, UNITPRICE, m_unitPrice),
+    AMT(OEInvBuy, MARKUP, m_markup),
+    AMT(OEInvBuy, COMMISSION, m_commission),
+    AMT(OEInvBuy, TAXES, m_taxes),
+    AMT(OEInvBuy, FEES, m_fees),
+    AMT(OEInvBuy, LOAD, m_load),
+    AMT(OEInvBuy, TOTAL, m_total),
+    AMT(OEInvBuy, REVERSALFEES, m_reversalFees),
+    TEXT(OEInvBuy, REVERSALFITID, m_reversalFitId),
+    CURRENCIES(OEInvBuy),
+    ENUM(OEInvBuy, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    ENUM(OEInvBuy, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+};
+const OETagRow kSellValid[] = {
+    V(INVTRAN),    V(SECID),        V(UNITS),         V(UNITPRICE),      V(MARKDOWN),
+    V(COMMISSION), V(TAXES),        V(FEES),          V(LOAD),           V(WITHHOLDING),
+    V(TAXEXEMPT),  V(TOTAL),        V2(REVERSALFEES), V2(REVERSALFITID), V(GAIN),
+    V(CURRENCY),   V(ORIGCURRENCY), V(SUBACCTSEC),    V(SUBACCTFUND),
+};
+const OEFieldRow kSellFields[] = {
+    HEAD(OEInvSell),
+    AMT(OEInvSell, UNITS, m_units),
+    AMT(OEInvSell, UNITPRICE, m_unitPrice),
+    AMT(OEInvSell, MARKDOWN, m_markdown),
+    AMT(OEInvSell, COMMISSION, m_commission),
+    AMT(OEInvSell, TAXES, m_taxes),
+    AMT(OEInvSell, FEES, m_fees),
+    AMT(OEInvSell, LOAD, m_load),
+    AMT(OEInvSell, WITHHOLDING, m_withholding),
+    FLAG(OEInvSell, TAXEXEMPT, m_taxExempt),
+    AMT(OEInvSell, TOTAL, m_total),
+    AMT(OEInvSell, REVERSALFEES, m_reversalFees),
+    TEXT(OEInvSell, REVERSALFITID, m_reversalFitId),
+    AMT(OEInvSell, GAIN, m_gain),
+    CURRENCIES(OEInvSell),
+    ENUM(OEInvSell, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    ENUM(OEInvSell, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+};
+
+// ---- the buy and sell kinds ----
+#define BUY(C) CHILD(C, INVBUY, m_trade, NewInvBuy)
+#define SELL(C) CHILD(C, INVSELL, m_trade, NewInvSell)
+const OETagRow kBuyStockValid[] = {V(INVBUY), V(BUYTYPE)};
+const OEFieldRow kBuyStockFields[] = {BUY(OEBuyStock), ENUM(OEBuyStock, BUYTYPE, m_type, OEKW_BUYTYPE)};
+const OETagRow kBuyMFValid[] = {V(INVBUY), V(BUYTYPE), V(RELFITID)};
+const OETagRow kBuyMFRequired[] = {V(INVBUY), V(BUYTYPE)};
+const OEFieldRow kBuyMFFields[] = {BUY(OEBuyMF), ENUM(OEBuyMF, BUYTYPE, m_type, OEKW_BUYTYPE),
+                                   TEXT(OEBuyMF, RELFITID, m_relFitId)};
+const OETagRow kBuyDebtValid[] = {V(INVBUY), V(ACCRDINT)};
+const OETagRow kBuyOnly[] = {V(INVBUY)};
+const OEFieldRow kBuyDebtFields[] = {BUY(OEBuyDebt), AMT(OEBuyDebt, ACCRDINT, m_accrdInt)};
+const OETagRow kBuyOptValid[] = {V(INVBUY), V(OPTBUYTYPE), V(SHPERCTRCT)};
+const OEFieldRow kBuyOptFields[] = {BUY(OEBuyOpt), ENUM(OEBuyOpt, OPTBUYTYPE, m_type, OEKW_OPTBUYTYPE),
+                                    COUNT(OEBuyOpt, SHPERCTRCT, m_shPerCtrct)};
+const OETagRow kBuyOtherValid[] = {V(INVBUY), V2(BUYTYPE)};
+const OEFieldRow kBuyOtherFields[] = {BUY(OEBuyOther), ENUM(OEBuyOther, BUYTYPE, m_type, OEKW_BUYTYPE)};
+
+const OETagRow kSellStockValid[] = {V(INVSELL), V(SELLTYPE)};
+const OEFieldRow kSellStockFields[] = {SELL(OESellStock), ENUM(OESellStock, SELLTYPE, m_type, OEKW_SELLTYPE)};
+const OETagRow kSellMFValid[] = {V(INVSELL), V(SELLTYPE), V(AVGCOSTBASIS), V(RELFITID)};
+const OETagRow kSellMFRequired[] = {V(INVSELL), V(SELLTYPE)};
+const OEFieldRow kSellMFFields[] = {SELL(OESellMF), ENUM(OESellMF, SELLTYPE, m_type, OEKW_SELLTYPE),
+                                    AMT(OESellMF, AVGCOSTBASIS, m_avgCostBasis),
+                                    TEXT(OESellMF, RELFITID, m_relFitId)};
+const OETagRow kSellDebtValid[] = {V(INVSELL), V(SELLREASON), V(ACCRDINT)};
+const OETagRow kSellDebtRequired[] = {V(INVSELL), V(SELLREASON)};
+const OEFieldRow kSellDebtFields[] = {SELL(OESellDebt), ENUM(OESellDebt, SELLREASON, m_type, OEKW_SELLREASON),
+                                      AMT(OESellDebt, ACCRDINT, m_accrdInt)};
+const OETagRow kSellOptValid[] = {V(INVSELL),  V(OPTSELLTYPE), V(SHPERCTRCT),
+                                  V(RELFITID), V(RELTYPE),     V(SECURED)};
+const OETagRow kSellOptRequired[] = {V(INVSELL), V(OPTSELLTYPE), V(SHPERCTRCT)};
+const OEFieldRow kSellOptFields[] = {
+    SELL(OESellOpt),
+    ENUM(OESellOpt, OPTSELLTYPE, m_type, OEKW_OPTSELLTYPE),
+    COUNT(OESellOpt, SHPERCTRCT, m_shPerCtrct),
+    TEXT(OESellOpt, RELFITID, m_relFitId),
+    ENUM(OESellOpt, RELTYPE, m_relType, OEKW_RELTYPE),
+    ENUM(OESellOpt, SECURED, m_secured, OEKW_SECURED),
+};
+const OETagRow kSellOtherValid[] = {V(INVSELL), V2(SELLTYPE)};
+const OETagRow kSellOnly[] = {V(INVSELL)};
+const OEFieldRow kSellOtherFields[] = {SELL(OESellOther), ENUM(OESellOther, SELLTYPE, m_type, OEKW_SELLTYPE)};
+
+// ---- the other transactions ----
+typedef OEOtherInvestmentTx X;
+const OETagRow kIncomeValid[] = {
+    V(INVTRAN),     V(SECID),     V(INCOMETYPE),  V(TOTAL),    V(SUBACCTSEC),
+    V(SUBACCTFUND), V(TAXEXEMPT), V(WITHHOLDING), V(CURRENCY), V(ORIGCURRENCY),
+};
+const OETagRow kIncomeRequired[] = {V(INVTRAN), V(SECID),      V(INCOMETYPE),
+                                    V(TOTAL),   V(SUBACCTSEC), V(SUBACCTFUND)};
+const OEFieldRow kIncomeFields[] = {
+    HEAD(X),
+    ENUM(X, INCOMETYPE, m_incomeType, OEKW_INCOMETYPE),
+    AMT(X, TOTAL, m_total),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    ENUM(X, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+    FLAG(X, TAXEXEMPT, m_taxExempt),
+    AMT(X, WITHHOLDING, m_withholding),
+    CURRENCIES(X),
+};
+const OETagRow kReinvestValid[] = {
+    V(INVTRAN),    V(SECID), V(INCOMETYPE), V(TOTAL), V(SUBACCTSEC), V(UNITS),    V(UNITPRICE),
+    V(COMMISSION), V(TAXES), V(FEES),       V(LOAD),  V(TAXEXEMPT),  V(CURRENCY), V(ORIGCURRENCY),
+};
+const OETagRow kReinvestRequired[] = {V(INVTRAN),    V(SECID), V(INCOMETYPE), V(TOTAL),
+                                      V(SUBACCTSEC), V(UNITS), V(UNITPRICE)};
+const OEFieldRow kReinvestFields[] = {
+    HEAD(X),
+    ENUM(X, INCOMETYPE, m_incomeType, OEKW_INCOMETYPE),
+    AMT(X, TOTAL, m_total),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    AMT(X, UNITS, m_units),
+    AMT(X, UNITPRICE, m_unitPrice),
+    AMT(X, COMMISSION, m_commission),
+    AMT(X, TAXES, m_taxes),
+    AMT(X, FEES, m_fees),
+    AMT(X, LOAD, m_load),
+    FLAG(X, TAXEXEMPT, m_taxExempt),
+    CURRENCIES(X),
+};
+const OETagRow kRetOfCapValid[] = {
+    V(INVTRAN), V(SECID), V(TOTAL), V(SUBACCTSEC), V(SUBACCTFUND), V(CURRENCY), V(ORIGCURRENCY),
+};
+const OETagRow kRetOfCapRequired[] = {V(INVTRAN), V(SECID), V(TOTAL), V(SUBACCTSEC), V(SUBACCTFUND)};
+const OEFieldRow kRetOfCapFields[] = {
+    HEAD(X),
+    AMT(X, TOTAL, m_total),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    ENUM(X, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+    CURRENCIES(X),
+};
+// INVEXPENSE has the same elements as RETOFCAP, in the same order.
+const OETagRow kSplitValid[] = {
+    V(INVTRAN),     V(SECID),    V(SUBACCTSEC),   V(OLDUNITS), V(NEWUNITS),    V(NUMERATOR),
+    V(DENOMINATOR), V(CURRENCY), V(ORIGCURRENCY), V(FRACCASH), V(SUBACCTFUND),
+};
+const OETagRow kSplitRequired[] = {V(INVTRAN),  V(SECID),     V(SUBACCTSEC), V(OLDUNITS),
+                                   V(NEWUNITS), V(NUMERATOR), V(DENOMINATOR)};
+const OEFieldRow kSplitFields[] = {
+    HEAD(X),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    AMT(X, OLDUNITS, m_oldUnits),
+    AMT(X, NEWUNITS, m_newUnits),
+    AMT(X, NUMERATOR, m_numerator),
+    AMT(X, DENOMINATOR, m_denominator),
+    CURRENCIES(X),
+    AMT(X, FRACCASH, m_fracCash),
+    ENUM(X, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+};
+const OETagRow kTransferValid[] = {
+    V(INVTRAN), V(SECID),       V(SUBACCTSEC),   V(UNITS),     V(TFERACTION),
+    V(POSTYPE), V(INVACCTFROM), V(AVGCOSTBASIS), V(UNITPRICE), V(DTPURCHASE),
+};
+const OETagRow kTransferRequired[] = {V(INVTRAN), V(SECID),      V(SUBACCTSEC),
+                                      V(UNITS),   V(TFERACTION), V(POSTYPE)};
+const OEFieldRow kTransferFields[] = {
+    HEAD(X),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    AMT(X, UNITS, m_units),
+    ENUM(X, TFERACTION, m_action, OEKW_TFERACTION),
+    ENUM(X, POSTYPE, m_posType, OEKW_POSTYPE),
+    CHILD(X, INVACCTFROM, m_invAcctFrom, NewInvAcctFrom),
+    AMT(X, AVGCOSTBASIS, m_avgCostBasis),
+    AMT(X, UNITPRICE, m_unitPrice),
+    DATE(X, DTPURCHASE, m_dtPurchase),
+};
+const OETagRow kJrnlFundValid[] = {V(INVTRAN), V(SUBACCTTO), V(SUBACCTFROM), V(TOTAL)};
+const OEFieldRow kJrnlFundFields[] = {
+    CHILD(X, INVTRAN, m_invTran, NewInvTran),
+    ENUM(X, SUBACCTTO, m_subAcctTo, OEKW_SUBACCT),
+    ENUM(X, SUBACCTFROM, m_subAcctFrom, OEKW_SUBACCT),
+    AMT(X, TOTAL, m_total),
+};
+const OETagRow kJrnlSecValid[] = {V(INVTRAN), V(SECID), V(SUBACCTTO), V(SUBACCTFROM), V(UNITS)};
+const OEFieldRow kJrnlSecFields[] = {
+    HEAD(X),
+    ENUM(X, SUBACCTTO, m_subAcctTo, OEKW_SUBACCT),
+    ENUM(X, SUBACCTFROM, m_subAcctFrom, OEKW_SUBACCT),
+    AMT(X, UNITS, m_units),
+};
+const OETagRow kMarginValid[] = {V(INVTRAN), V(TOTAL), V(SUBACCTFUND), V(CURRENCY), V(ORIGCURRENCY)};
+const OETagRow kMarginRequired[] = {V(INVTRAN), V(TOTAL), V(SUBACCTFUND)};
+const OEFieldRow kMarginFields[] = {
+    CHILD(X, INVTRAN, m_invTran, NewInvTran),
+    AMT(X, TOTAL, m_total),
+    ENUM(X, SUBACCTFUND, m_subAcctFund, OEKW_SUBACCT),
+    CURRENCIES(X),
+};
+const OETagRow kClosureValid[] = {V(INVTRAN),    V(SECID),      V(OPTACTION), V(UNITS),
+                                  V(SHPERCTRCT), V(SUBACCTSEC), V(RELFITID),  V(GAIN)};
+const OETagRow kClosureRequired[] = {V(INVTRAN), V(SECID),      V(OPTACTION),
+                                     V(UNITS),   V(SHPERCTRCT), V(SUBACCTSEC)};
+const OEFieldRow kClosureFields[] = {
+    HEAD(X),
+    ENUM(X, OPTACTION, m_action, OEKW_OPTACTION),
+    AMT(X, UNITS, m_units),
+    COUNT(X, SHPERCTRCT, m_shPerCtrct),
+    ENUM(X, SUBACCTSEC, m_subAcctSec, OEKW_SUBACCT),
+    TEXT(X, RELFITID, m_relFitId),
+    AMT(X, GAIN, m_gain),
+};
+
+// ---- INVTRANLIST ----
+typedef OEInvTranList L;
+const OETagRow kTranListValid[] = {
+    V(DTSTART),  V(DTEND),          V(INVBANKTRAN), V(BUYDEBT),  V(BUYMF),      V(BUYOPT),
+    V(BUYOTHER), V(BUYSTOCK),       V(CLOSUREOPT),  V(INCOME),   V(INVEXPENSE), V(JRNLFUND),
+    V(JRNLSEC),  V(MARGININTEREST), V(REINVEST),    V(RETOFCAP), V(SELLDEBT),   V(SELLMF),
+    V(SELLOPT),  V(SELLOTHER),      V(SELLSTOCK),   V(SPLIT),    V(TRANSFER)};
+const OETagRow kTranListRequired[] = {V(DTSTART), V(DTEND)};
+const OEFieldRow kTranListFields[] = {
+    DATE(L, DTSTART, m_dtStart),
+    DATE(L, DTEND, m_dtEnd),
+    ENTRY(L, INVBANKTRAN, NewInvBankTran),
+    ENTRY(L, BUYDEBT, NewBuyDebt),
+    ENTRY(L, BUYMF, NewBuyMF),
+    ENTRY(L, BUYOPT, NewBuyOpt),
+    ENTRY(L, BUYOTHER, NewBuyOther),
+    ENTRY(L, BUYSTOCK, NewBuyStock),
+    ENTRY(L, CLOSUREOPT, NewClosureOpt),
+    ENTRY(L, INCOME, NewIncome),
+    ENTRY(L, INVEXPENSE, NewInvExpense),
+    ENTRY(L, JRNLFUND, NewJrnlFund),
+    ENTRY(L, JRNLSEC, NewJrnlSec),
+    ENTRY(L, MARGININTEREST, NewMarginInterest),
+    ENTRY(L, REINVEST, NewReinvest),
+    ENTRY(L, RETOFCAP, NewRetOfCap),
+    ENTRY(L, SELLDEBT, NewSellDebt),
+    ENTRY(L, SELLMF, NewSellMF),
+    ENTRY(L, SELLOPT, NewSellOpt),
+    ENTRY(L, SELLOTHER, NewSellOther),
+    ENTRY(L, SELLSTOCK, NewSellStock),
+    ENTRY(L, SPLIT, NewSplit),
+    ENTRY(L, TRANSFER, NewTransfer),
+};
+
+// ---- BALLIST, INVBAL ----
+const OETagRow kBalListValid[] = {V(BAL)};
+const OEFieldRow kBalListFields[] = {
+    {OETAG_BAL, OEFK_LIST, OE_MEMBER(OEBalList, m_bal), nullptr, OE_MAKE(NewBalance)}};
+const OETagRow kInvBalValid[] = {V(AVAILCASH), V(MARGINBALANCE), V(SHORTBALANCE), V(BUYPOWER), V(BALLIST)};
+const OETagRow kInvBalRequired[] = {V(AVAILCASH), V(MARGINBALANCE), V(SHORTBALANCE)};
+const OEFieldRow kInvBalFields[] = {
+    AMT(OEInvBal, AVAILCASH, m_availCash),           AMT(OEInvBal, MARGINBALANCE, m_marginBalance),
+    AMT(OEInvBal, SHORTBALANCE, m_shortBalance),     AMT(OEInvBal, BUYPOWER, m_buyPower),
+    CHILD(OEInvBal, BALLIST, m_balList, NewBalList),
+};
+
+// ---- INVPOS, the position kinds, INVPOSLIST ----
+const OETagRow kPosValid[] = {
+    V(SECID),         V(HELDINACCT),  V(POSTYPE),  V(UNITS), V(UNITPRICE), V(MKTVAL),
+    V2(AVGCOSTBASIS), V(DTPRICEASOF), V(CURRENCY), V1(MEMO), V2(MEMO2),
+};
+const OETagRow kPosRequired[] = {V(SECID),     V(HELDINACCT), V(POSTYPE),    V(UNITS),
+                                 V(UNITPRICE), V(MKTVAL),     V(DTPRICEASOF)};
+const OEFieldRow kPosFields[] = {
+    CHILD(OEInvPos, SECID, m_secId, NewSecID),
+    ENUM(OEInvPos, HELDINACCT, m_heldInAcct, OEKW_SUBACCT),
+    ENUM(OEInvPos, POSTYPE, m_posType, OEKW_POSTYPE),
+    AMT(OEInvPos, UNITS, m_units),
+    AMT(OEInvPos, UNITPRICE, m_unitPrice),
+    AMT(OEInvPos, MKTVAL, m_mktVal),
+    AMT(OEInvPos, AVGCOSTBASIS, m_avgCostBasis),
+    DATE(OEInvPos, DTPRICEASOF, m_dtPriceAsOf),
+    CHILD(OEInvPos, CURRENCY, m_currency, NewCurrency),
+    TEXT(OEInvPos, MEMO, m_memo),
+    TEXT(OEInvPos, MEMO2, m_memo2),
+};
+typedef OEPosition P;
+const OETagRow kInvPosOnly[] = {V(INVPOS)};
+const OETagRow kPosStockValid[] = {V(INVPOS), V(UNITSSTREET), V(UNITSUSER), V(REINVDIV)};
+const OETagRow kPosMFValid[] = {V(INVPOS), V(UNITSSTREET), V(UNITSUSER), V(REINVDIV), V(REINVCG)};
+const OETagRow kPosOptValid[] = {V(INVPOS), V(SECURED)};
+const OEFieldRow kPosMFFields[] = {
+    CHILD(P, INVPOS, m_invPos, NewInvPos), AMT(P, UNITSSTREET, m_unitsStreet), AMT(P, UNITSUSER, m_unitsUser),
+    FLAG(P, REINVDIV, m_reinvDiv),         FLAG(P, REINVCG, m_reinvCG),
+};
+const OEFieldRow kPosOptFields[] = {CHILD(P, INVPOS, m_invPos, NewInvPos),
+                                    ENUM(P, SECURED, m_secured, OEKW_SECURED)};
+const OETagRow kPosListValid[] = {V(POSDEBT), V(POSMF), V(POSOPT), V(POSOTHER), V(POSSTOCK)};
+const OEFieldRow kPosListFields[] = {
+    ENTRY(OEInvPosList, POSDEBT, NewPosDebt),   ENTRY(OEInvPosList, POSMF, NewPosMF),
+    ENTRY(OEInvPosList, POSOPT, NewPosOpt),     ENTRY(OEInvPosList, POSOTHER, NewPosOther),
+    ENTRY(OEInvPosList, POSSTOCK, NewPosStock),
+};
+
+// A descriptor whose field rows are the first `n` rows of a longer table: the POSSTOCK rows are
+// the POSMF rows without REINVCG, POSDEBT and POSOTHER have only INVPOS.
+#define OE_DESC_PREFIX(tag, valid, required, fields, n)                                                      \
+    OEAggregateDesc {                                                                                        \
+        tag, valid, static_cast<unsigned short>(sizeof(valid) / sizeof(valid[0])), required,                 \
+            static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields, n                   \
+    }
+
+const OEAggregateDesc kAcctDesc = OE_DESC(OETAG_INVACCTFROM, kAcctValid, kAcctValid, kAcctFields);
+const OEAggregateDesc kIncPosDesc = OE_DESC(OETAG_INCPOS, kIncPosValid, kIncPosRequired, kIncPosFields);
+const OEAggregateDesc kRqDesc = OE_DESC(OETAG_INVSTMTRQ, kRqValid, kRqRequired, kRqFields);
+const OEAggregateDesc kRsDesc = OE_DESC(OETAG_INVSTMTRS, kRsValid, kRsRequired, kRsFields);
+const OEAggregateDesc kTranDesc = OE_DESC(OETAG_INVTRAN, kTranValid, kTranRequired, kTranFields);
+const OEAggregateDesc kBankTranDesc =
+    OE_DESC(OETAG_INVBANKTRAN, kBankTranValid, kBankTranValid, kBankTranFields);
+const OEAggregateDesc kBuyDesc = OE_DESC(OETAG_INVBUY, kBuyValid, kTradeRequired, kBuyFields);
+const OEAggregateDesc kSellDesc = OE_DESC(OETAG_INVSELL, kSellValid, kTradeRequired, kSellFields);
+const OEAggregateDesc kBuyStockDesc =
+    OE_DESC(OETAG_BUYSTOCK, kBuyStockValid, kBuyStockValid, kBuyStockFields);
+const OEAggregateDesc kBuyMFDesc = OE_DESC(OETAG_BUYMF, kBuyMFValid, kBuyMFRequired, kBuyMFFields);
+const OEAggregateDesc kBuyDebtDesc = OE_DESC(OETAG_BUYDEBT, kBuyDebtValid, kBuyOnly, kBuyDebtFields);
+const OEAggregateDesc kBuyOptDesc = OE_DESC(OETAG_BUYOPT, kBuyOptValid, kBuyOptValid, kBuyOptFields);
+const OEAggregateDesc kBuyOtherDesc = OE_DESC(OETAG_BUYOTHER, kBuyOtherValid, kBuyOnly, kBuyOtherFields);
+const OEAggregateDesc kSellStockDesc =
+    OE_DESC(OETAG_SELLSTOCK, kSellStockValid, kSellStockValid, kSellStockFields);
+const OEAggregateDesc kSellMFDesc = OE_DESC(OETAG_SELLMF, kSellMFValid, kSellMFRequired, kSellMFFields);
+const OEAggregateDesc kSellDebtDesc =
+    OE_DESC(OETAG_SELLDEBT, kSellDebtValid, kSellDebtRequired, kSellDebtFields);
+const OEAggregateDesc kSellOptDesc = OE_DESC(OETAG_SELLOPT, kSellOptValid, kSellOptRequired, kSellOptFields);
+const OEAggregateDesc kSellOtherDesc = OE_DESC(OETAG_SELLOTHER, kSellOtherValid, kSellOnly, kSellOtherFields);
+const OEAggregateDesc kIncomeDesc = OE_DESC(OETAG_INCOME, kIncomeValid, kIncomeRequired, kIncomeFields);
+const OEAggregateDesc kReinvestDesc =
+    OE_DESC(OETAG_REINVEST, kReinvestValid, kReinvestRequired, kReinvestFields);
+const OEAggregateDesc kRetOfCapDesc =
+    OE_DESC(OETAG_RETOFCAP, kRetOfCapValid, kRetOfCapRequired, kRetOfCapFields);
+const OEAggregateDesc kInvExpenseDesc =
+    OE_DESC(OETAG_INVEXPENSE, kRetOfCapValid, kRetOfCapRequired, kRetOfCapFields);
+const OEAggregateDesc kSplitDesc = OE_DESC(OETAG_SPLIT, kSplitValid, kSplitRequired, kSplitFields);
+const OEAggregateDesc kTransferDesc =
+    OE_DESC(OETAG_TRANSFER, kTransferValid, kTransferRequired, kTransferFields);
+const OEAggregateDesc kJrnlFundDesc =
+    OE_DESC(OETAG_JRNLFUND, kJrnlFundValid, kJrnlFundValid, kJrnlFundFields);
+const OEAggregateDesc kJrnlSecDesc = OE_DESC(OETAG_JRNLSEC, kJrnlSecValid, kJrnlSecValid, kJrnlSecFields);
+const OEAggregateDesc kMarginDesc =
+    OE_DESC(OETAG_MARGININTEREST, kMarginValid, kMarginRequired, kMarginFields);
+const OEAggregateDesc kClosureDesc =
+    OE_DESC(OETAG_CLOSUREOPT, kClosureValid, kClosureRequired, kClosureFields);
+const OEAggregateDesc kTranListDesc =
+    OE_DESC(OETAG_INVTRANLIST, kTranListValid, kTranListRequired, kTranListFields);
+const OEAggregateDesc kBalListDesc = OE_DESC_NO_REQUIRED(OETAG_BALLIST, kBalListValid, kBalListFields);
+const OEAggregateDesc kInvBalDesc = OE_DESC(OETAG_INVBAL, kInvBalValid, kInvBalRequired, kInvBalFields);
+const OEAggregateDesc kPosDesc = OE_DESC(OETAG_INVPOS, kPosValid, kPosRequired, kPosFields);
+const OEAggregateDesc kPosStockDesc =
+    OE_DESC_PREFIX(OETAG_POSSTOCK, kPosStockValid, kInvPosOnly, kPosMFFields, 4);
+const OEAggregateDesc kPosMFDesc = OE_DESC(OETAG_POSMF, kPosMFValid, kInvPosOnly, kPosMFFields);
+const OEAggregateDesc kPosDebtDesc = OE_DESC_PREFIX(OETAG_POSDEBT, kInvPosOnly, kInvPosOnly, kPosMFFields, 1);
+const OEAggregateDesc kPosOptDesc = OE_DESC(OETAG_POSOPT, kPosOptValid, kInvPosOnly, kPosOptFields);
+const OEAggregateDesc kPosOtherDesc =
+    OE_DESC_PREFIX(OETAG_POSOTHER, kInvPosOnly, kInvPosOnly, kPosMFFields, 1);
+const OEAggregateDesc kPosListDesc = OE_DESC_NO_REQUIRED(OETAG_INVPOSLIST, kPosListValid, kPosListFields);
+
+} // namespace
+
+#define OE_INVEST_DEFINE(C, Base, desc, tag)                                                                 \
+    C::C(unsigned short version) : Base(version) {                                                           \
+        SetType(tag);                                                                                        \
+    }                                                                                                        \
+    const OEAggregateDesc& C::Describe() const {                                                             \
+        return desc;                                                                                         \
+    }
+
+OE_INVEST_DEFINE(OEInvAcctFrom, OEAggregate, kAcctDesc, OETAG_INVACCTFROM)
+OE_INVEST_DEFINE(OEIncPos, OEAggregate, kIncPosDesc, OETAG_INCPOS)
+OE_INVEST_DEFINE(OEInvStmtRq, OEAccountFromOf, kRqDesc, OETAG_INVSTMTRQ)
+OE_INVEST_DEFINE(OEInvStmtRs, OEAccountFromOf, kRsDesc, OETAG_INVSTMTRS)
+OE_INVEST_DEFINE(OEInvTran, OEAggregate, kTranDesc, OETAG_INVTRAN)
+OE_INVEST_DEFINE(OEInvBankTran, OEInvestmentTx, kBankTranDesc, OETAG_INVBANKTRAN)
+OE_INVEST_DEFINE(OEInvBuy, OEInvestmentTx, kBuyDesc, OETAG_INVBUY)
+OE_INVEST_DEFINE(OEInvSell, OEInvestmentTx, kSellDesc, OETAG_INVSELL)
+OE_INVEST_DEFINE(OEBuyStock, OEBuyTrade, kBuyStockDesc, OETAG_BUYSTOCK)
+OE_INVEST_DEFINE(OEBuyMF, OEBuyTrade, kBuyMFDesc, OETAG_BUYMF)
+OE_INVEST_DEFINE(OEBuyDebt, OEBuyTrade, kBuyDebtDesc, OETAG_BUYDEBT)
+OE_INVEST_DEFINE(OEBuyOpt, OEBuyTrade, kBuyOptDesc, OETAG_BUYOPT)
+OE_INVEST_DEFINE(OEBuyOther, OEBuyTrade, kBuyOtherDesc, OETAG_BUYOTHER)
+OE_INVEST_DEFINE(OESellStock, OESellTrade, kSellStockDesc, OETAG_SELLSTOCK)
+OE_INVEST_DEFINE(OESellMF, OESellTrade, kSellMFDesc, OETAG_SELLMF)
+OE_INVEST_DEFINE(OESellDebt, OESellTrade, kSellDebtDesc, OETAG_SELLDEBT)
+OE_INVEST_DEFINE(OESellOpt, OESellTrade, kSellOptDesc, OETAG_SELLOPT)
+OE_INVEST_DEFINE(OESellOther, OESellTrade, kSellOtherDesc, OETAG_SELLOTHER)
+OE_INVEST_DEFINE(OEIncome, OEOtherInvestmentTx, kIncomeDesc, OETAG_INCOME)
+OE_INVEST_DEFINE(OEReinvest, OEOtherInvestmentTx, kReinvestDesc, OETAG_REINVEST)
+OE_INVEST_DEFINE(OERetOfCap, OEOtherInvestmentTx, kRetOfCapDesc, OETAG_RETOFCAP)
+OE_INVEST_DEFINE(OESplit, OEOtherInvestmentTx, kSplitDesc, OETAG_SPLIT)
+OE_INVEST_DEFINE(OETransfer, OEOtherInvestmentTx, kTransferDesc, OETAG_TRANSFER)
+OE_INVEST_DEFINE(OEJrnlFund, OEOtherInvestmentTx, kJrnlFundDesc, OETAG_JRNLFUND)
+OE_INVEST_DEFINE(OEJrnlSec, OEOtherInvestmentTx, kJrnlSecDesc, OETAG_JRNLSEC)
+OE_INVEST_DEFINE(OEMarginInterest, OEOtherInvestmentTx, kMarginDesc, OETAG_MARGININTEREST)
+OE_INVEST_DEFINE(OEClosureOpt, OEOtherInvestmentTx, kClosureDesc, OETAG_CLOSUREOPT)
+OE_INVEST_DEFINE(OEInvExpense, OEOtherInvestmentTx, kInvExpenseDesc, OETAG_INVEXPENSE)
+OE_INVEST_DEFINE(OEInvTranList, OEDateRangeOf, kTranListDesc, OETAG_INVTRANLIST)
+OE_INVEST_DEFINE(OEBalList, OEAggregate, kBalListDesc, OETAG_BALLIST)
+OE_INVEST_DEFINE(OEInvBal, OEAggregate, kInvBalDesc, OETAG_INVBAL)
+OE_INVEST_DEFINE(OEInvPos, OEAggregate, kPosDesc, OETAG_INVPOS)
+OE_INVEST_DEFINE(OEPosStock, OEPosition, kPosStockDesc, OETAG_POSSTOCK)
+OE_INVEST_DEFINE(OEPosMF, OEPosition, kPosMFDesc, OETAG_POSMF)
+OE_INVEST_DEFINE(OEPosDebt, OEPosition, kPosDebtDesc, OETAG_POSDEBT)
+OE_INVEST_DEFINE(OEPosOpt, OEPosition, kPosOptDesc, OETAG_POSOPT)
+OE_INVEST_DEFINE(OEPosOther, OEPosition, kPosOtherDesc, OETAG_POSOTHER)
+OE_INVEST_DEFINE(OEInvPosList, OEMixedList, kPosListDesc, OETAG_INVPOSLIST)
+
+unsigned short OEInvStmtRq::SetIncludeFlag(OETagID tag, unsigned short v) {
+    const OEFieldRow* row = FindRow(tag);
+    if (!row || row->m_kind != OEFK_BOOL) return 0;
+    return SetNumber(tag, v);
+}
+
+unsigned short OEInvestmentTx::SetCurrency(OECurrency* currency) {
+    if (!currency) return SetChildObj(OETAG_CURRENCY, nullptr);
+    return SetChildObj(currency->GetType() == OETAG_ORIGCURRENCY ? OETAG_ORIGCURRENCY : OETAG_CURRENCY,
+                       currency);
+}
