@@ -242,4 +242,129 @@ TEST(InvestCorpus, ReadsAsWrittenAndRoundTripsInBothForms) {
     }
 }
 
+// A request made in code is written in element order, is complete only with its four required
+// parts, and reads back into the same tree through its transaction wrapper.
+TEST(Invest, RequestBuildsInOrderAndReadsBack) {
+    std::unique_ptr<OEInvStmtRq> rq(F()->NewInvStmtRq(1));
+    OEIncPos* pos = F()->NewIncPos(1);
+    pos->SetInclude(static_cast<unsigned short>(1));
+    rq->SetIncPos(pos);
+    EXPECT_EQ(rq->SetIncludeFlag(OETAG_INCBAL, 1), 1);
+    EXPECT_EQ(rq->SetIncludeFlag(OETAG_CURDEF, 1), 0) << "not a mark of the request";
+    EXPECT_EQ(rq->AllRequiredPresent(), 0);
+    OEInvAcctFrom* account = F()->NewInvAcctFrom(1);
+    account->SetBrokerId(OEString("broker.example"));
+    account->SetAcctId(OEString("A1"));
+    rq->SetAccountFrom(account);
+    rq->SetIncludeFlag(OETAG_INCOO, 0);
+    EXPECT_EQ(rq->AllRequiredPresent(), 1);
+    OEIncTransaction* inc = F()->NewIncTransaction(1);
+    inc->SetInclude(static_cast<unsigned short>(1));
+    inc->SetDateStart(OEString("20240101"));
+    rq->SetIncTransaction(inc);
+    const char kWritten[] =
+        "<INVACCTFROM>\n<BROKERID>broker.example\n<ACCTID>A1\n</INVACCTFROM>\n<INCTRAN>\n"
+        "<DTSTART>20240101\n<INCLUDE>Y\n</INCTRAN>\n<INCOO>N\n<INCPOS>\n<INCLUDE>Y\n</INCPOS>\n"
+        "<INCBAL>Y\n";
+    EXPECT_EQ(BuildText(rq.get()), kWritten);
+
+    std::unique_ptr<OEFileRq> file(F()->NewFileRq(1));
+    ASSERT_EQ(ParseInto(std::string("<OFX><INVSTMTMSGSRQV1><INVSTMTTRNRQ><TRNUID>9<INVSTMTRQ>") + kWritten +
+                            "</INVSTMTRQ></INVSTMTTRNRQ></INVSTMTMSGSRQV1></OFX>",
+                        file.get()),
+              OEPS_OK);
+    std::string text = BuildText(file.get());
+    EXPECT_NE(text.find(std::string("<INVSTMTRQ>\n") + kWritten + "</INVSTMTRQ>"), std::string::npos) << text;
+}
+
+// The shared blocks keep their version rules and their elements' bounds and keywords.
+TEST(Invest, ElementRulesOfTheSharedBlocks) {
+    struct Row {
+        unsigned short version;
+        OETagID tag;
+        const char* value;
+        unsigned short stored;
+    };
+    const Row rows[] = {
+        {1, OETAG_SRVRTID, "s", 1},  {1, OETAG_SRVRTID2, "s", 0},       {2, OETAG_SRVRTID, "s", 0},
+        {2, OETAG_SRVRTID2, "s", 1}, {1, OETAG_MEMO, "m", 1},           {2, OETAG_MEMO2, "m", 1},
+        {2, OETAG_MEMO, "m", 0},     {1, OETAG_DTTRADE, "20240105", 1}, {1, OETAG_DTTRADE, "yesterday", 0},
+    };
+    for (const Row& r : rows) {
+        std::unique_ptr<OEInvTran> t(F()->NewInvTran(r.version));
+        unsigned short stored = 0;
+        if (r.tag == OETAG_SRVRTID) stored = t->SetServerTxId(OEString(r.value));
+        if (r.tag == OETAG_SRVRTID2) stored = t->SetServerTxId2(OEString(r.value));
+        if (r.tag == OETAG_MEMO) stored = t->SetMemo(OEString(r.value));
+        if (r.tag == OETAG_MEMO2) stored = t->SetMemo2(OEString(r.value));
+        if (r.tag == OETAG_DTTRADE) stored = t->SetDateTrade(OEString(r.value));
+        EXPECT_EQ(stored, r.stored) << TagName(r.tag) << " v" << r.version << " " << r.value;
+        EXPECT_EQ(t->ValidateTag(r.tag), r.stored);
+    }
+    // A buy takes REVERSALFEES only after version 1; BUYOTHER has BUYTYPE only after version 1;
+    // keywords are matched ignoring case and a wrong one is refused.
+    std::unique_ptr<OEInvBuy> v1(F()->NewInvBuy(1)), v2(F()->NewInvBuy(2));
+    EXPECT_EQ(v1->SetElement(OETAG_REVERSALFEES, OEString("1")), 0);
+    EXPECT_EQ(v2->SetElement(OETAG_REVERSALFEES, OEString("1")), 1);
+    EXPECT_EQ(v1->SetElement(OETAG_SUBACCTSEC, OEString("margin")), 1);
+    EXPECT_EQ(v1->GetSubAcctSec(), OESA_MARGIN);
+    EXPECT_EQ(v1->SetElement(OETAG_SUBACCTFUND, OEString("BANK")), 0);
+    EXPECT_EQ(v1->ValidateTag(OETAG_SUBACCTFUND), 0);
+    EXPECT_EQ(v1->SetElement(OETAG_MARKDOWN, OEString("1")), 0) << "a sell's element";
+    std::unique_ptr<OEBuyOther> other1(F()->NewBuyOther(1)), other2(F()->NewBuyOther(2));
+    EXPECT_EQ(other1->SetElement(OETAG_BUYTYPE, OEString("BUY")), 0);
+    EXPECT_EQ(other2->SetElement(OETAG_BUYTYPE, OEString("BUYTOCOVER")), 1);
+    EXPECT_EQ(other2->GetNumberOf(OETAG_BUYTYPE), static_cast<unsigned long>(OEBUY_BUYTOCOVER));
+    // Only POSMF has REINVCG; POSDEBT has nothing beyond INVPOS.
+    std::unique_ptr<OEPosMF> mf(F()->NewPosMF(1));
+    std::unique_ptr<OEPosStock> stock(F()->NewPosStock(1));
+    std::unique_ptr<OEPosDebt> debt(F()->NewPosDebt(1));
+    EXPECT_EQ(mf->SetElement(OETAG_REINVCG, OEString("Y")), 1);
+    EXPECT_EQ(mf->GetReinvCG(), 1);
+    EXPECT_EQ(stock->SetElement(OETAG_REINVCG, OEString("Y")), 0);
+    EXPECT_EQ(stock->SetElement(OETAG_REINVDIV, OEString("N")), 1);
+    EXPECT_EQ(debt->SetElement(OETAG_UNITSSTREET, OEString("1")), 0);
+}
+
+// The lists take only their own kinds, keep the order of appending, and copy each entry as its kind.
+TEST(Invest, MixedListsKeepOrderAndKinds) {
+    std::unique_ptr<OEInvTranList> list(F()->NewInvTranList(1));
+    list->SetDateStart(OEString("20240101"));
+    list->SetDateEnd(OEString("20240201"));
+    std::unique_ptr<OEInvPos> stray(F()->NewInvPos(1));
+    EXPECT_EQ(list->AppendTransaction(stray.get()), 0) << "not a transaction: the caller keeps it";
+    EXPECT_EQ(list->AppendTransaction(nullptr), 0);
+    OESellOpt* sell = F()->NewSellOpt(1);
+    sell->SetElement(OETAG_OPTSELLTYPE, OEString("SELLTOCLOSE"));
+    OEIncome* income = F()->NewIncome(1);
+    income->SetElement(OETAG_INCOMETYPE, OEString("CGLONG"));
+    OEBuyStock* buy = F()->NewBuyStock(1);
+    for (OEAggregate* tx : std::vector<OEAggregate*>{sell, income, buy})
+        ASSERT_EQ(list->AppendTransaction(tx), 1);
+    const char kWritten[] = "<DTSTART>20240101\n<DTEND>20240201\n<SELLOPT>\n<OPTSELLTYPE>SELLTOCLOSE\n"
+                            "</SELLOPT>\n<INCOME>\n<INCOMETYPE>CGLONG\n</INCOME>\n<BUYSTOCK>\n</BUYSTOCK>\n";
+    EXPECT_EQ(BuildText(list.get()), kWritten);
+    EXPECT_EQ(list->GetNumberOfChildren(), 3);
+    EXPECT_EQ(list->GetChild(1), income);
+
+    std::unique_ptr<OEInvTranList> copy(F()->NewInvTranList(1));
+    ASSERT_EQ(copy->DeepCopyFrom(list.get()), 1);
+    EXPECT_EQ(BuildText(copy.get()), kWritten);
+    EXPECT_NE(dynamic_cast<OESellOpt*>(copy->GetTransaction(0)), nullptr);
+
+    list->DeleteAllTransaction();
+    EXPECT_EQ(list->ValidateTag(OETAG_SELLOPT), 0);
+    EXPECT_EQ(BuildText(list.get()), "<DTSTART>20240101\n<DTEND>20240201\n");
+
+    // CURRENCY and ORIGCURRENCY share one slot in a transaction: setting one replaces the other.
+    std::unique_ptr<OEIncome> tx(F()->NewIncome(1));
+    OECurrency* orig = F()->NewCurrency(1);
+    orig->SetType(OETAG_ORIGCURRENCY);
+    ASSERT_EQ(tx->SetCurrency(orig), 1);
+    EXPECT_EQ(tx->ValidateTag(OETAG_ORIGCURRENCY), 1);
+    ASSERT_EQ(tx->SetCurrency(F()->NewCurrency(1)), 1);
+    EXPECT_EQ(tx->ValidateTag(OETAG_ORIGCURRENCY), 0);
+    EXPECT_EQ(tx->ValidateTag(OETAG_CURRENCY), 1);
+}
+
 } // namespace
