@@ -860,63 +860,62 @@ unsigned short OEAggregate::DeepCopyFrom(const OEAggregate* other) {
     return CopyBaseMembersFrom(other);
 }
 
-unsigned short OEAggregate::CopyRow(const OEFieldRow* row, const OEAggregate* other, OEDataObjFactory* factory) {
-    {
-        void* to = Slot(row);
-        const void* from = other->Slot(row);
-        switch (row->m_kind) {
-        case OEFK_TEXT:
-            *static_cast<OEString*>(to) = *static_cast<const OEString*>(from);
-            break;
-        case OEFK_AMOUNT:
-            *static_cast<OEPrecisionInteger*>(to) = *static_cast<const OEPrecisionInteger*>(from);
-            break;
-        case OEFK_DATETIME:
-            *static_cast<OEDateTime*>(to) = *static_cast<const OEDateTime*>(from);
-            break;
-        case OEFK_ENUM:
-        case OEFK_BOOL:
-        case OEFK_USHORT:
-            *static_cast<unsigned short*>(to) = *static_cast<const unsigned short*>(from);
-            break;
-        case OEFK_ULONG:
-            *static_cast<unsigned long*>(to) = *static_cast<const unsigned long*>(from);
-            break;
-        case OEFK_SLONG:
-            *static_cast<long*>(to) = *static_cast<const long*>(from);
-            break;
-        case OEFK_TEXTLIST:
-            static_cast<OEDynamicArrayString*>(to)->DeleteAll();
-            if (!static_cast<OEDynamicArrayString*>(to)->DeepCopyFrom(
-                    *static_cast<const OEDynamicArrayString*>(from)))
-                return 0;
-            break;
-        case OEFK_CHILD: {
-            OEDataObj* src = *static_cast<OEDataObj* const*>(from);
-            if (!src || src->GetType() != row->m_tag) break;
-            OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, src->GetMsgSetVersion()));
+unsigned short OEAggregate::CopyRow(const OEFieldRow* row, const OEAggregate* other,
+                                    OEDataObjFactory* factory) {
+    void* to = Slot(row);
+    const void* from = other->Slot(row);
+    switch (row->m_kind) {
+    case OEFK_TEXT:
+        *static_cast<OEString*>(to) = *static_cast<const OEString*>(from);
+        break;
+    case OEFK_AMOUNT:
+        *static_cast<OEPrecisionInteger*>(to) = *static_cast<const OEPrecisionInteger*>(from);
+        break;
+    case OEFK_DATETIME:
+        *static_cast<OEDateTime*>(to) = *static_cast<const OEDateTime*>(from);
+        break;
+    case OEFK_ENUM:
+    case OEFK_BOOL:
+    case OEFK_USHORT:
+        *static_cast<unsigned short*>(to) = *static_cast<const unsigned short*>(from);
+        break;
+    case OEFK_ULONG:
+        *static_cast<unsigned long*>(to) = *static_cast<const unsigned long*>(from);
+        break;
+    case OEFK_SLONG:
+        *static_cast<long*>(to) = *static_cast<const long*>(from);
+        break;
+    case OEFK_TEXTLIST:
+        static_cast<OEDynamicArrayString*>(to)->DeleteAll();
+        if (!static_cast<OEDynamicArrayString*>(to)->DeepCopyFrom(
+                *static_cast<const OEDynamicArrayString*>(from)))
+            return 0;
+        break;
+    case OEFK_CHILD: {
+        OEDataObj* src = *static_cast<OEDataObj* const*>(from);
+        if (!src || src->GetType() != row->m_tag) break;
+        OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, src->GetMsgSetVersion()));
+        if (!copy) return 0;
+        *static_cast<OEDataObj**>(to) = copy;
+        if (!copy->DeepCopyFrom(static_cast<const OEAggregate*>(src))) return 0;
+        break;
+    }
+    case OEFK_LIST: {
+        const OEDataObjList* src = static_cast<const OEDataObjList*>(from);
+        OEDataObjList* dst = static_cast<OEDataObjList*>(to);
+        for (unsigned short k = 0; k < src->Entries(); ++k) {
+            const OEAggregate* e = static_cast<const OEAggregate*>(src->Get(k));
+            if (!e) continue;
+            OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, e->GetMsgSetVersion()));
             if (!copy) return 0;
-            *static_cast<OEDataObj**>(to) = copy;
-            if (!copy->DeepCopyFrom(static_cast<const OEAggregate*>(src))) return 0;
-            break;
-        }
-        case OEFK_LIST: {
-            const OEDataObjList* src = static_cast<const OEDataObjList*>(from);
-            OEDataObjList* dst = static_cast<OEDataObjList*>(to);
-            for (unsigned short k = 0; k < src->Entries(); ++k) {
-                const OEAggregate* e = static_cast<const OEAggregate*>(src->Get(k));
-                if (!e) continue;
-                OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, e->GetMsgSetVersion()));
-                if (!copy) return 0;
-                if (!dst->Append(copy)) {
-                    delete copy;
-                    return 0;
-                }
-                if (!copy->DeepCopyFrom(e)) return 0;
+            if (!dst->Append(copy)) {
+                delete copy;
+                return 0;
             }
-            break;
+            if (!copy->DeepCopyFrom(e)) return 0;
         }
-        }
+        break;
+    }
     }
     return 1;
 }
@@ -1062,5 +1061,6 @@ void OEMixedList::DeleteAllEntries() {
     m_entries.DeleteAll();
     const OEAggregateDesc& d = Describe();
     for (unsigned short i = 0; i < d.m_fieldCount; ++i)
-        if (d.m_fields[i].m_kind == OEFK_LIST && ValidateTag(d.m_fields[i].m_tag)) ClearTag(d.m_fields[i].m_tag);
+        if (d.m_fields[i].m_kind == OEFK_LIST && ValidateTag(d.m_fields[i].m_tag))
+            ClearTag(d.m_fields[i].m_tag);
 }
