@@ -174,6 +174,11 @@ public:
     const OEPrecisionInteger* GetAccruedInterest() const { return GetAmount(OETAG_ACCRDINT); }
     const OEPrecisionInteger* GetAvgCostBasis() const { return GetAmount(OETAG_AVGCOSTBASIS); }
     const OEString* GetRelFITId() const { return GetText(OETAG_RELFITID); }
+    OEBuyType GetBuyType() const { return static_cast<OEBuyType>(GetNumber(OETAG_BUYTYPE)); }
+    OESellType GetSellType() const { return static_cast<OESellType>(GetNumber(OETAG_SELLTYPE)); }
+    OEOptBuyType GetOptBuyType() const { return static_cast<OEOptBuyType>(GetNumber(OETAG_OPTBUYTYPE)); }
+    OEOptSellType GetOptSellType() const { return static_cast<OEOptSellType>(GetNumber(OETAG_OPTSELLTYPE)); }
+    OESellReason GetSellReason() const { return static_cast<OESellReason>(GetNumber(OETAG_SELLREASON)); }
 
     OEOwnedChild m_trade;
     unsigned short m_type = 0, m_relType = 0, m_secured = 0; // BUYTYPE / SELLTYPE / OPT... / SELLREASON
@@ -213,6 +218,18 @@ public:
     unsigned long GetNumberOf(OETagID tag) const { return GetNumber(tag); }
     const OEDateTime* GetDateOf(OETagID tag) const { return GetDateTime(tag); }
     const OEString* GetTextOf(OETagID tag) const { return GetText(tag); }
+    // SPLIT
+    const OEPrecisionInteger* GetOldUnits() const { return GetAmount(OETAG_OLDUNITS); }
+    const OEPrecisionInteger* GetNewUnits() const { return GetAmount(OETAG_NEWUNITS); }
+    const OEPrecisionInteger* GetNumerator() const { return GetAmount(OETAG_NUMERATOR); }
+    const OEPrecisionInteger* GetDenominator() const { return GetAmount(OETAG_DENOMINATOR); }
+    // JRNLFUND, JRNLSEC
+    OESubAcct GetSubAcctTo() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTTO)); }
+    OESubAcct GetSubAcctFrom() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTFROM)); }
+    // TRANSFER, CLOSUREOPT
+    OETferAction GetTferAction() const { return static_cast<OETferAction>(GetNumber(OETAG_TFERACTION)); }
+    OEPosType GetPosType() const { return static_cast<OEPosType>(GetNumber(OETAG_POSTYPE)); }
+    OEOptAction GetOptAction() const { return static_cast<OEOptAction>(GetNumber(OETAG_OPTACTION)); }
     // TRANSFER's INVACCTFROM.
     OEInvAcctFrom* GetInvAcctFrom() const {
         return static_cast<OEInvAcctFrom*>(GetChildObj(OETAG_INVACCTFROM));

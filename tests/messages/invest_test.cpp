@@ -314,7 +314,7 @@ TEST(Invest, ElementRulesOfTheSharedBlocks) {
     std::unique_ptr<OEBuyOther> other1(F()->NewBuyOther(1)), other2(F()->NewBuyOther(2));
     EXPECT_EQ(other1->SetElement(OETAG_BUYTYPE, OEString("BUY")), 0);
     EXPECT_EQ(other2->SetElement(OETAG_BUYTYPE, OEString("BUYTOCOVER")), 1);
-    EXPECT_EQ(other2->GetNumberOf(OETAG_BUYTYPE), static_cast<unsigned long>(OEBUY_BUYTOCOVER));
+    EXPECT_EQ(other2->GetBuyType(), OEBUY_BUYTOCOVER);
     // Only POSMF has REINVCG; POSDEBT has nothing beyond INVPOS.
     std::unique_ptr<OEPosMF> mf(F()->NewPosMF(1));
     std::unique_ptr<OEPosStock> stock(F()->NewPosStock(1));
