@@ -367,4 +367,19 @@ TEST(Invest, MixedListsKeepOrderAndKinds) {
     EXPECT_EQ(tx->ValidateTag(OETAG_CURRENCY), 1);
 }
 
+// A statement cut short anywhere leaves a partial tree that still builds, copies and is freed.
+TEST(InvestCorpus, TruncatedStatementsLeaveUsableTrees) {
+    std::string text;
+    if (!ReadFile(kCorpusDir + "/ofxparse/fidelity.ofx", text)) GTEST_SKIP() << "corpus not found";
+    size_t from = text.find("<INVSTMTRS>");
+    for (size_t cut = from; cut < text.size(); cut += 53) {
+        std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
+        ParseInto(text.substr(0, cut), file.get());
+        ASSERT_EQ(file->GetNumberOfResponse(), 1) << cut;
+        std::unique_ptr<OEResponse> copy(F()->NewResponse(0));
+        ASSERT_EQ(copy->DeepCopyFrom(file->GetResponse(0)), 1) << cut;
+        EXPECT_EQ(BuildText(copy.get()), BuildText(file->GetResponse(0))) << cut;
+    }
+}
+
 } // namespace
