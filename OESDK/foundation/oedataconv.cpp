@@ -241,6 +241,7 @@ OE_KEYWORD_TABLE(OEKW_BANKTXTYPE, kBankTxTable)
 
 const char* const kBuyTypeTable[] = {"BUY", "BUYTOCOVER"};
 OE_KEYWORD_PAIR(OEDataConversion, BuyType, OEBuyType, 0, kBuyTypeTable)
+OE_KEYWORD_TABLE(OEKW_BUYTYPE, kBuyTypeTable)
 
 const char* const kCallTypeTable[] = {"CALL", "PUT", "PREFUND", "MATURITY"};
 OE_KEYWORD_PAIR(OEDataConversion, CallType, OECallType, 0, kCallTypeTable)
@@ -274,6 +275,7 @@ OE_KEYWORD_TABLE(OEKW_DEBTTYPE, kDebtTypeTable)
 
 const char* const kDurationTable[] = {"DAY", "GOODTILCANCEL", "IMMEDIATE"};
 OE_KEYWORD_PAIR(OEDataConversion, Duration, OEDuration, 0, kDurationTable)
+OE_KEYWORD_TABLE(OEKW_DURATION, kDurationTable)
 
 const char* const kExtdPmtForTable[] = {"INDIVIDUAL", "BUSINESS"};
 OE_KEYWORD_PAIR(OEDataConversion, ExtdPmtFor, OEExtdPmtFor, 0, kExtdPmtForTable)
@@ -327,9 +329,11 @@ OE_KEYWORD_PAIR(OEDataConversion, OptAction, OEOptAction, 0, kOptActionTable)
 
 const char* const kOptBuyTypeTable[] = {"BUYTOOPEN", "BUYTOCLOSE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptBuyType, OEOptBuyType, 0, kOptBuyTypeTable)
+OE_KEYWORD_TABLE(OEKW_OPTBUYTYPE, kOptBuyTypeTable)
 
 const char* const kOptSellTypeTable[] = {"SELLTOOPEN", "SELLTOCLOSE"};
 OE_KEYWORD_PAIR(OEDataConversion, OptSellType, OEOptSellType, 0, kOptSellTypeTable)
+OE_KEYWORD_TABLE(OEKW_OPTSELLTYPE, kOptSellTypeTable)
 
 const char* const kOptTypeTable[] = {"PUT", "CALL", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, OptType, OEOptType, 0, kOptTypeTable)
@@ -349,6 +353,7 @@ OE_KEYWORD_PAIR(OEDataConversion, RelType, OERelType, 0, kRelTypeTable)
 
 const char* const kRestrictionTable[] = {"ALLORNONE", "MINUNITS", "NONE"};
 OE_KEYWORD_PAIR(OEDataConversion, Restriction, OERestriction, 0, kRestrictionTable)
+OE_KEYWORD_TABLE(OEKW_RESTRICTION, kRestrictionTable)
 
 const char* const kSecuredTable[] = {"NAKED", "COVERED"};
 OE_KEYWORD_PAIR(OEDataConversion, Secured, OESecured, 0, kSecuredTable)
@@ -358,6 +363,7 @@ OE_KEYWORD_PAIR(OEDataConversion, SellReason, OESellReason, 0, kSellReasonTable)
 
 const char* const kSellTypeTable[] = {"SELL", "SELLSHORT"};
 OE_KEYWORD_PAIR(OEDataConversion, SellType, OESellType, 0, kSellTypeTable)
+OE_KEYWORD_TABLE(OEKW_SELLTYPE, kSellTypeTable)
 
 const char* const kServiceTable[] = {"BANKSVC", "BPSVC", "INVSVC"};
 OE_KEYWORD_PAIR(OEDataConversion, Service, OEService, 0, kServiceTable)
@@ -381,6 +387,7 @@ OE_KEYWORD_TABLE(OEKW_STOCKTYPE, kStockTypeTable)
 
 const char* const kSubAcctTable[] = {"CASH", "MARGIN", "SHORT", "OTHER"};
 OE_KEYWORD_PAIR(OEDataConversion, SubAcct, OESubAcct, 0, kSubAcctTable)
+OE_KEYWORD_TABLE(OEKW_SUBACCT, kSubAcctTable)
 
 const char* const kSyncModeTable[] = {"FULL", "LITE"};
 OE_KEYWORD_PAIR(OEDataConversion, SyncMode, OESyncMode, 0, kSyncModeTable)
@@ -395,3 +402,4 @@ OE_KEYWORD_PAIR(OEDataConversion, USProductType, OEUSProductType, 0, kUSProductT
 
 const char* const kUnitTypeTable[] = {"SHARES", "CURRENCY"};
 OE_KEYWORD_PAIR(OEDataConversion, UnitType, OEUnitType, 0, kUnitTypeTable)
+OE_KEYWORD_TABLE(OEKW_UNITTYPE, kUnitTypeTable)

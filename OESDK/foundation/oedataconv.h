@@ -44,6 +44,14 @@ extern OE_API const OEKeywordTable OEKW_DEBTCLASS;        // "TREASURY" ... "OTH
 extern OE_API const OEKeywordTable OEKW_CALLTYPE;         // "CALL", "PUT", "PREFUND", "MATURITY"
 extern OE_API const OEKeywordTable OEKW_MFTYPE;           // "OPENEND", "CLOSEEND", "OTHER"
 extern OE_API const OEKeywordTable OEKW_STOCKTYPE;        // "COMMON" ... "OTHER"
+extern OE_API const OEKeywordTable OEKW_SUBACCT;          // "CASH", "MARGIN", "SHORT", "OTHER"
+extern OE_API const OEKeywordTable OEKW_DURATION;         // "DAY", "GOODTILCANCEL", "IMMEDIATE"
+extern OE_API const OEKeywordTable OEKW_RESTRICTION;      // "ALLORNONE", "MINUNITS", "NONE"
+extern OE_API const OEKeywordTable OEKW_BUYTYPE;          // "BUY", "BUYTOCOVER"
+extern OE_API const OEKeywordTable OEKW_SELLTYPE;         // "SELL", "SELLSHORT"
+extern OE_API const OEKeywordTable OEKW_UNITTYPE;         // "SHARES", "CURRENCY"
+extern OE_API const OEKeywordTable OEKW_OPTBUYTYPE;       // "BUYTOOPEN", "BUYTOCLOSE"
+extern OE_API const OEKeywordTable OEKW_OPTSELLTYPE;      // "SELLTOOPEN", "SELLTOCLOSE"
 
 class OE_API OEDataConversion {
 public:

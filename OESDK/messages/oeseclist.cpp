@@ -164,11 +164,11 @@ const OETagRow kSecListValid[] = {{OETAG_DEBTINFO, OEVM_ALL, 0},
                                   {OETAG_OTHERINFO, OEVM_ALL, 0},
                                   {OETAG_STOCKINFO, OEVM_ALL, 0}};
 const OEFieldRow kSecListFields[] = {
-    {OETAG_DEBTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewDebtInfo)},
-    {OETAG_MFINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewMFInfo)},
-    {OETAG_OPTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewOptInfo)},
-    {OETAG_OTHERINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewOtherInfo)},
-    {OETAG_STOCKINFO, OEFK_LIST, OE_MEMBER(OESecList, m_securities), nullptr, OE_MAKE(NewStockInfo)},
+    {OETAG_DEBTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewDebtInfo)},
+    {OETAG_MFINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewMFInfo)},
+    {OETAG_OPTINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewOptInfo)},
+    {OETAG_OTHERINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewOtherInfo)},
+    {OETAG_STOCKINFO, OEFK_LIST, OE_MEMBER(OESecList, m_entries), nullptr, OE_MAKE(NewStockInfo)},
 };
 
 // ---- SECRQ, SECLISTRQ, SECLISTRS ----
@@ -224,7 +224,7 @@ OE_SECLIST_CLASS(OEMFInfo, OESecurityInfo, kMFDesc, OETAG_MFINFO)
 OE_SECLIST_CLASS(OEOptInfo, OESecurityInfo, kOptDesc, OETAG_OPTINFO)
 OE_SECLIST_CLASS(OEOtherInfo, OESecurityInfo, kOtherDesc, OETAG_OTHERINFO)
 OE_SECLIST_CLASS(OEStockInfo, OESecurityInfo, kStockDesc, OETAG_STOCKINFO)
-OE_SECLIST_CLASS(OESecList, OEAggregate, kSecListDesc, OETAG_SECLIST)
+OE_SECLIST_CLASS(OESecList, OEMixedList, kSecListDesc, OETAG_SECLIST)
 OE_SECLIST_CLASS(OESecRq, OEAggregate, kSecRqDesc, OETAG_SECRQ)
 OE_SECLIST_CLASS(OESecListRq, OETransBase, kSecListRqDesc, OETAG_SECLISTRQ)
 OE_SECLIST_CLASS(OESecListRs, OETransBase, kSecListRsDesc, OETAG_SECLISTRS)
@@ -236,26 +236,26 @@ OECouponFreq OEDebtInfo::GetCouponFreq() const {
     return static_cast<OECouponFreq>(v);
 }
 
-// ---------------------------------------------------------------- OESecList
+// ---------------------------------------------------------------- OEMixedList
 
-int OESecList::Build(OEBuilder* builder) {
-    return BuildEach(this, builder, m_securities);
+int OEMixedList::Build(OEBuilder* builder) {
+    return BuildEach(this, builder, m_entries);
 }
 
-unsigned short OESecList::DeepCopyFrom(const OEAggregate* other) {
+unsigned short OEMixedList::DeepCopyFrom(const OEAggregate* other) {
     if (!other || other == this) return other ? 1 : 0;
     if (&other->Describe() != &Describe()) return 0;
     OEDataObjFactory* factory = GetFactory();
     if (!factory) return 0;
-    m_securities.DeleteAll();
-    const OEDataObjList& from = static_cast<const OESecList*>(other)->m_securities;
+    m_entries.DeleteAll();
+    const OEDataObjList& from = static_cast<const OEMixedList*>(other)->m_entries;
     for (unsigned short k = 0; k < from.Entries(); ++k) {
         const OEAggregate* source = static_cast<const OEAggregate*>(from.Get(k));
         const OEFieldRow* row = source ? FindRow(source->GetType()) : nullptr;
         if (!row) continue; // nothing to copy, or not a kind this list can make
         OEAggregate* copy = static_cast<OEAggregate*>(row->m_make(factory, source->GetMsgSetVersion()));
         if (!copy) return 0;
-        if (!m_securities.Append(copy)) {
+        if (!m_entries.Append(copy)) {
             delete copy;
             return 0;
         }
@@ -264,13 +264,15 @@ unsigned short OESecList::DeepCopyFrom(const OEAggregate* other) {
     return CopyBaseMembersFrom(other);
 }
 
-unsigned short OESecList::AppendSecurity(OESecurityInfo* info) {
-    if (!info || !FindRow(info->GetType())) return 0;
-    return AppendToList(info->GetType(), info);
+unsigned short OEMixedList::AppendEntry(OEDataObj* entry) {
+    const OEFieldRow* row = entry ? FindRow(entry->GetType()) : nullptr;
+    if (!row || row->m_kind != OEFK_LIST) return 0;
+    return AppendToList(entry->GetType(), entry);
 }
 
-void OESecList::DeleteAllSecurity() {
-    m_securities.DeleteAll();
-    for (const OETagRow& row : kSecListValid)
-        if (ValidateTag(row.m_tag)) ClearTag(row.m_tag);
+void OEMixedList::DeleteAllEntries() {
+    m_entries.DeleteAll();
+    const OEAggregateDesc& d = Describe();
+    for (unsigned short k = 0; k < d.m_validCount; ++k)
+        if (ValidateTag(d.m_valid[k].m_tag)) ClearTag(d.m_valid[k].m_tag);
 }

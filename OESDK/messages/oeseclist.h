@@ -290,29 +290,39 @@ public:
     OEString32 m_typeDesc;
 };
 
-// SECLIST: any number of security descriptions of the five kinds, kept in one list in the order
-// they were read or appended, and written back in that order (a file may mix the kinds freely).
-class OE_API OESecList : public OEAggregate {
+// An aggregate whose list rows of several kinds share one list, so that entries are kept, written,
+// walked and copied once each, in the order they were read or appended (a file may mix the kinds
+// freely). Each list row of the descriptor names the factory operation of its kind.
+class OE_API OEMixedList : public OEAggregate {
+public:
+    explicit OEMixedList(unsigned short version = 0) : OEAggregate(version) {}
+    int Build(OEBuilder* builder) override;
+    OEDataObj* GetChild(unsigned short index) const override { return m_entries.Get(index); }
+    unsigned short GetNumberOfChildren() const override { return m_entries.Entries(); }
+    unsigned short DeepCopyFrom(const OEAggregate* other) override;
+
+    OEDataObjList m_entries;
+
+protected:
+    // Appends an entry of any kind the list has a row for; the list owns it. 0 for null or for an
+    // object of another kind (the caller keeps it).
+    unsigned short AppendEntry(OEDataObj* entry);
+    // Deletes every entry and clears the marks of every kind.
+    void DeleteAllEntries();
+};
+
+// SECLIST: any number of security descriptions of the five kinds, in document order.
+class OE_API OESecList : public OEMixedList {
 public:
     explicit OESecList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    // One list for five rows: written, walked and copied once, each entry as its own kind.
-    int Build(OEBuilder* builder) override;
-    OEDataObj* GetChild(unsigned short index) const override { return m_securities.Get(index); }
-    unsigned short GetNumberOfChildren() const override { return m_securities.Entries(); }
-    unsigned short DeepCopyFrom(const OEAggregate* other) override;
 
-    // Appends a description of any of the five kinds (its own tag says which); the list owns it.
-    // 0 for null or for an object of another kind (the caller keeps it).
-    unsigned short AppendSecurity(OESecurityInfo* info);
+    unsigned short AppendSecurity(OESecurityInfo* info) { return AppendEntry(info); }
     OESecurityInfo* GetSecurity(unsigned short index) const {
-        return static_cast<OESecurityInfo*>(m_securities.Get(index));
+        return static_cast<OESecurityInfo*>(m_entries.Get(index));
     }
-    unsigned short GetNumSecurity() const { return m_securities.Entries(); }
-    // Deletes every entry and clears the five marks.
-    void DeleteAllSecurity();
-
-    OEDataObjList m_securities;
+    unsigned short GetNumSecurity() const { return m_entries.Entries(); }
+    void DeleteAllSecurity() { DeleteAllEntries(); }
 };
 
 // SECRQ: one security asked for, by exactly one of SECID, TICKER and FIID.
