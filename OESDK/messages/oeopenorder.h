@@ -98,6 +98,23 @@ public:
     unsigned short m_unitType = 0, m_buyType = 0, m_sellType = 0;
 };
 
+// The kinds whose own elements are all shared ones (held by OEOpenOrder) differ only in their
+// tables: OOBUYMF (BUYTYPE, UNITTYPE), OOBUYOTHER (UNITTYPE), OOBUYSTOCK (BUYTYPE), OOSELLDEBT (nothing
+// beyond the OO), OOSELLOTHER (UNITTYPE) and OOSELLSTOCK (SELLTYPE).
+#define OE_OPEN_ORDER_KIND(C)                                                                                \
+    class OE_API C : public OEOpenOrder {                                                                    \
+    public:                                                                                                  \
+        explicit C(unsigned short version = 0);                                                              \
+        const OEAggregateDesc& Describe() const override;                                                    \
+    }
+OE_OPEN_ORDER_KIND(OEOOBuyMF);
+OE_OPEN_ORDER_KIND(OEOOBuyOther);
+OE_OPEN_ORDER_KIND(OEOOBuyStock);
+OE_OPEN_ORDER_KIND(OEOOSellDebt);
+OE_OPEN_ORDER_KIND(OEOOSellOther);
+OE_OPEN_ORDER_KIND(OEOOSellStock);
+#undef OE_OPEN_ORDER_KIND
+
 // OOBUYDEBT: a bond to buy, perhaps at auction.
 class OE_API OEOOBuyDebt : public OEOpenOrder {
 public:
@@ -114,13 +131,6 @@ public:
     OEDateTime m_dtAuction;
 };
 
-// OOBUYMF: a fund to buy (BUYTYPE and UNITTYPE).
-class OE_API OEOOBuyMF : public OEOpenOrder {
-public:
-    explicit OEOOBuyMF(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
-
 // OOBUYOPT: an option to buy.
 class OE_API OEOOBuyOpt : public OEOpenOrder {
 public:
@@ -133,27 +143,6 @@ public:
     }
 
     unsigned short m_optBuyType = 0;
-};
-
-// OOBUYOTHER: any other security to buy (UNITTYPE).
-class OE_API OEOOBuyOther : public OEOpenOrder {
-public:
-    explicit OEOOBuyOther(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
-
-// OOBUYSTOCK: a stock to buy (BUYTYPE).
-class OE_API OEOOBuyStock : public OEOpenOrder {
-public:
-    explicit OEOOBuyStock(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
-
-// OOSELLDEBT: a bond to sell; nothing beyond the OO.
-class OE_API OEOOSellDebt : public OEOpenOrder {
-public:
-    explicit OEOOSellDebt(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
 };
 
 // OOSELLMF: a fund to sell (SELLTYPE, UNITTYPE), perhaps the whole holding.
@@ -180,20 +169,6 @@ public:
     }
 
     unsigned short m_optSellType = 0;
-};
-
-// OOSELLOTHER: any other security to sell (UNITTYPE).
-class OE_API OEOOSellOther : public OEOpenOrder {
-public:
-    explicit OEOOSellOther(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
-
-// OOSELLSTOCK: a stock to sell (SELLTYPE).
-class OE_API OEOOSellStock : public OEOpenOrder {
-public:
-    explicit OEOOSellStock(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
 };
 
 // OOSWITCHMF: a switch from the fund of the OO into the fund of its own SECID (UNITTYPE),

@@ -274,11 +274,6 @@ TEST(OpenOrder, VersionsKindsAndBadValues) {
     EXPECT_EQ(BuildText(mine.get()), "");
 }
 
-int g_left = 0;
-int FailAfterN(std::size_t) {
-    return g_left-- > 0 ? 0 : 1;
-}
-
 // Failing the n-th allocation of a parse or a deep copy: a status, never a crash or a leak; a copy
 // that reports success with no error recorded is whole.
 TEST(OpenOrder, RunningOutOfMemoryInAParseOrACopyIsReported) {
@@ -288,14 +283,8 @@ TEST(OpenOrder, RunningOutOfMemoryInAParseOrACopyIsReported) {
     bool parsedWhole = false;
     for (int allowed = 0; allowed < 400; allowed += 7) {
         std::unique_ptr<OEInvOOList> list(F()->NewInvOOList(1)), copy(F()->NewInvOOList(1));
-        OEThreadState::SetErrorCode(OETE_NONE);
-        OEMemory::FailureHook previous = OEMemory::SetFailureHook(&FailAfterN);
-        g_left = allowed;
-        status = ParseInto(text, list.get());
-        OEThreadState::SetErrorCode(OETE_NONE);
-        g_left = allowed;
-        unsigned short copied = copy->DeepCopyFrom(source.get());
-        OEMemory::SetFailureHook(previous);
+        status = WithAllocations(allowed, [&] { return ParseInto(text, list.get()); });
+        unsigned short copied = WithAllocations(allowed, [&] { return copy->DeepCopyFrom(source.get()); });
         EXPECT_TRUE(status == OEPS_NORESOURCE || status == OEPS_WARNINGS || status == OEPS_OK)
             << allowed << ": " << status;
         if (status == OEPS_OK) {
