@@ -63,24 +63,6 @@ inline unsigned short LogCount() {
     return OEParseLogger::TheOEParseLogger()->GetNumberParseExceptions();
 }
 
-// Runs `step` with only the first `allowed` allocations granted (the later ones fail as when memory
-// is short), the thread's error cleared before it; the previous failure hook is put back after.
-inline int& AllocationsLeft() {
-    static int left = 0;
-    return left;
-}
-inline int FailWhenNoneLeft(std::size_t) {
-    return AllocationsLeft()-- > 0 ? 0 : 1;
-}
-template <class Step> auto WithAllocations(int allowed, Step step) -> decltype(step()) {
-    OEThreadState::SetErrorCode(OETE_NONE);
-    OEMemory::FailureHook previous = OEMemory::SetFailureHook(&FailWhenNoneLeft);
-    AllocationsLeft() = allowed;
-    auto result = step();
-    OEMemory::SetFailureHook(previous);
-    return result;
-}
-
 } // namespace msgtest
 
 #endif

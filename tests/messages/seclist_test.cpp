@@ -288,6 +288,11 @@ TEST(SecList, RequestWrapperMakesTheListRequest) {
     EXPECT_STREQ(rq->GetSecRq(1)->GetFIId()->c_str(), "7");
 }
 
+int g_left = 0;
+int FailAfterN(std::size_t) {
+    return g_left-- > 0 ? 0 : 1;
+}
+
 // Failing the n-th allocation of a parse or a deep copy, for a range of n: a status, never a crash or
 // a leak; a copy that reports success with no error recorded is whole.
 TEST(SecList, RunningOutOfMemoryInAParseOrACopyIsReported) {
@@ -297,8 +302,14 @@ TEST(SecList, RunningOutOfMemoryInAParseOrACopyIsReported) {
     for (int allowed = 0; allowed < 240; allowed += 3) {
         std::unique_ptr<OEFileRs> file(F()->NewFileRs(0));
         std::unique_ptr<OEResponse> copy(F()->NewResponse(0));
-        status = WithAllocations(allowed, [&] { return ParseInto(kSecListSet, file.get()); });
-        unsigned short copied = WithAllocations(allowed, [&] { return copy->DeepCopyFrom(source); });
+        OEThreadState::SetErrorCode(OETE_NONE);
+        OEMemory::FailureHook previous = OEMemory::SetFailureHook(&FailAfterN);
+        g_left = allowed;
+        status = ParseInto(kSecListSet, file.get());
+        OEThreadState::SetErrorCode(OETE_NONE);
+        g_left = allowed;
+        unsigned short copied = copy->DeepCopyFrom(source);
+        OEMemory::SetFailureHook(previous);
         EXPECT_TRUE(status == OEPS_NORESOURCE || status == OEPS_WARNINGS || status == OEPS_INVALID)
             << allowed << ": " << status;
         if (copied && OEThreadState::GetErrorCode() == OETE_NONE) {
