@@ -2,9 +2,7 @@
 // list (MB/s of input) and built back to text (MB/s of output).
 //
 //   ./build-rel/bench_openorder --benchmark_min_time=1
-#include "oesdk.h"
-
-#include <benchmark/benchmark.h>
+#include "parse_build.h"
 
 #include <memory>
 #include <string>
@@ -41,51 +39,19 @@ const std::string& Body() {
     return body;
 }
 
-struct Attached {
-    Attached() { OEAttachThread(OEPlatform::CurrentThreadId()); }
-};
-const Attached attached;
+const benchutil::Attached attached;
 
-std::unique_ptr<OEInvOOList> Parse(OEBuffer* buffer) {
-    std::unique_ptr<OEInvOOList> list(OEDataObj::GetFactory()->NewInvOOList(1));
-    OESimpleParser parser;
-    if (parser.Parse(buffer, list.get(), 0, 0) != OEPS_OK) return nullptr;
-    return list;
+std::unique_ptr<OEInvOOList> NewRoot() {
+    return std::unique_ptr<OEInvOOList>(OEDataObj::GetFactory()->NewInvOOList(1));
 }
 
 void OpenOrderParse(benchmark::State& state) {
-    const std::string& text = Body();
-    OEBuffer buffer(static_cast<unsigned long>(text.size() + 1), 1 << 20);
-    buffer.WriteLarge(text.data(), static_cast<unsigned long>(text.size()));
-    for (auto _ : state) {
-        std::unique_ptr<OEInvOOList> list = Parse(&buffer);
-        if (!list || list->GetNumOpenOrder() != kOrders) state.SkipWithError("parse failed");
-        state.PauseTiming(); // freeing the tree is not part of parsing it
-        list.reset();
-        state.ResumeTiming();
-    }
-    state.SetBytesProcessed(static_cast<int64_t>(state.iterations()) * static_cast<int64_t>(text.size()));
+    benchutil::ParseLoop(state, Body(), NewRoot);
 }
 BENCHMARK(OpenOrderParse)->Unit(benchmark::kMillisecond);
 
 void OpenOrderBuild(benchmark::State& state) {
-    const std::string& text = Body();
-    OEBuffer in(static_cast<unsigned long>(text.size() + 1), 1 << 20);
-    in.WriteLarge(text.data(), static_cast<unsigned long>(text.size()));
-    std::unique_ptr<OEInvOOList> list = Parse(&in);
-    if (!list) {
-        state.SkipWithError("parse failed");
-        return;
-    }
-    unsigned long written = 0;
-    for (auto _ : state) {
-        OEBuffer out(static_cast<unsigned long>(text.size() * 2), 1 << 20);
-        OEBuilder builder;
-        if (builder.Build(&out, list.get(), OEBSO_LENIENT, 0, 0) != OEBS_OK)
-            state.SkipWithError("build failed");
-        written = out.GetBufferSize();
-    }
-    state.SetBytesProcessed(static_cast<int64_t>(state.iterations()) * static_cast<int64_t>(written));
+    benchutil::BuildLoop(state, Body(), NewRoot);
 }
 BENCHMARK(OpenOrderBuild)->Unit(benchmark::kMillisecond);
 
