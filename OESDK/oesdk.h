@@ -59,6 +59,7 @@
 #include "messages/oestmtend.h"
 #include "messages/oechallenge.h"
 #include "messages/oeseclist.h"
+#include "messages/oeopenorder.h"
 #include "messages/oeinvest.h"
 
 // Transport

@@ -2,9 +2,7 @@
 // an asset mix), parsed to a typed tree (MB/s of input) and built back to text (MB/s of output).
 //
 //   ./build-rel/bench_seclist --benchmark_min_time=1
-#include "oesdk.h"
-
-#include <benchmark/benchmark.h>
+#include "parse_build.h"
 
 #include <memory>
 #include <string>
@@ -56,52 +54,19 @@ const std::string& Document() {
     return doc;
 }
 
-struct Attached {
-    Attached() { OEAttachThread(OEPlatform::CurrentThreadId()); }
-};
-const Attached attached;
+const benchutil::Attached attached;
 
-std::unique_ptr<OEFileRs> Parse(OEBuffer* buffer) {
-    std::unique_ptr<OEFileRs> file(OEDataObj::GetFactory()->NewFileRs(0));
-    OESimpleParser parser;
-    if (parser.Parse(buffer, file.get(), 0, 0) != OEPS_OK) return nullptr;
-    return file;
+std::unique_ptr<OEFileRs> NewRoot() {
+    return std::unique_ptr<OEFileRs>(OEDataObj::GetFactory()->NewFileRs(0));
 }
 
 void SecListParse(benchmark::State& state) {
-    const std::string& text = Document();
-    OEBuffer buffer(static_cast<unsigned long>(text.size() + 1), 1 << 20);
-    buffer.WriteLarge(text.data(), static_cast<unsigned long>(text.size()));
-    for (auto _ : state) {
-        std::unique_ptr<OEFileRs> file = Parse(&buffer);
-        if (!file) state.SkipWithError("parse failed");
-        benchmark::DoNotOptimize(file.get());
-        state.PauseTiming(); // freeing the tree is not part of parsing it
-        file.reset();
-        state.ResumeTiming();
-    }
-    state.SetBytesProcessed(static_cast<int64_t>(state.iterations()) * static_cast<int64_t>(text.size()));
+    benchutil::ParseLoop(state, Document(), NewRoot);
 }
 BENCHMARK(SecListParse)->Unit(benchmark::kMillisecond);
 
 void SecListBuild(benchmark::State& state) {
-    const std::string& text = Document();
-    OEBuffer in(static_cast<unsigned long>(text.size() + 1), 1 << 20);
-    in.WriteLarge(text.data(), static_cast<unsigned long>(text.size()));
-    std::unique_ptr<OEFileRs> file = Parse(&in);
-    if (!file) {
-        state.SkipWithError("parse failed");
-        return;
-    }
-    unsigned long written = 0;
-    for (auto _ : state) {
-        OEBuffer out(static_cast<unsigned long>(text.size() * 2), 1 << 20);
-        OEBuilder builder;
-        if (builder.Build(&out, file.get(), OEBSO_LENIENT, 0, 0) != OEBS_OK)
-            state.SkipWithError("build failed");
-        written = out.GetBufferSize();
-    }
-    state.SetBytesProcessed(static_cast<int64_t>(state.iterations()) * static_cast<int64_t>(written));
+    benchutil::BuildLoop(state, Document(), NewRoot);
 }
 BENCHMARK(SecListBuild)->Unit(benchmark::kMillisecond);
 

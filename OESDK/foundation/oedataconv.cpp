@@ -275,6 +275,7 @@ OE_KEYWORD_TABLE(OEKW_DEBTTYPE, kDebtTypeTable)
 
 const char* const kDurationTable[] = {"DAY", "GOODTILCANCEL", "IMMEDIATE"};
 OE_KEYWORD_PAIR(OEDataConversion, Duration, OEDuration, 0, kDurationTable)
+OE_KEYWORD_TABLE(OEKW_DURATION, kDurationTable)
 
 const char* const kExtdPmtForTable[] = {"INDIVIDUAL", "BUSINESS"};
 OE_KEYWORD_PAIR(OEDataConversion, ExtdPmtFor, OEExtdPmtFor, 0, kExtdPmtForTable)
@@ -356,6 +357,7 @@ OE_KEYWORD_TABLE(OEKW_RELTYPE, kRelTypeTable)
 
 const char* const kRestrictionTable[] = {"ALLORNONE", "MINUNITS", "NONE"};
 OE_KEYWORD_PAIR(OEDataConversion, Restriction, OERestriction, 0, kRestrictionTable)
+OE_KEYWORD_TABLE(OEKW_RESTRICTION, kRestrictionTable)
 
 const char* const kSecuredTable[] = {"NAKED", "COVERED"};
 OE_KEYWORD_PAIR(OEDataConversion, Secured, OESecured, 0, kSecuredTable)
@@ -407,3 +409,4 @@ OE_KEYWORD_PAIR(OEDataConversion, USProductType, OEUSProductType, 0, kUSProductT
 
 const char* const kUnitTypeTable[] = {"SHARES", "CURRENCY"};
 OE_KEYWORD_PAIR(OEDataConversion, UnitType, OEUnitType, 0, kUnitTypeTable)
+OE_KEYWORD_TABLE(OEKW_UNITTYPE, kUnitTypeTable)

@@ -8,6 +8,7 @@
 #include "messages/oechallenge.h"
 #include "messages/oecurrency.h"
 #include "messages/oemsgset.h"
+#include "messages/oeopenorder.h"
 #include "messages/oeprofile.h"
 #include "messages/oestmtend.h"
 #include "messages/oeseclist.h"
@@ -196,6 +197,9 @@ OEOtherInfo* OEDataObjFactory::NewOtherInfo(unsigned short version) {
 OEStockInfo* OEDataObjFactory::NewStockInfo(unsigned short version) {
     return Create<OEStockInfo>(version);
 }
+OEInvOOList* OEDataObjFactory::NewInvOOList(unsigned short version) {
+    return Create<OEInvOOList>(version);
+}
 OESecID* OEDataObjFactory::NewSecID(unsigned short version) {
     return Create<OESecID>(version);
 }
@@ -213,6 +217,42 @@ OESecListRs* OEDataObjFactory::NewSecListRs(unsigned short version) {
 }
 OESecListRq* OEDataObjFactory::NewSecListRq(unsigned short version) {
     return Create<OESecListRq>(version);
+}
+OEOO* OEDataObjFactory::NewOO(unsigned short version) {
+    return Create<OEOO>(version);
+}
+OEOOBuyDebt* OEDataObjFactory::NewOOBuyDebt(unsigned short version) {
+    return Create<OEOOBuyDebt>(version);
+}
+OEOOBuyMF* OEDataObjFactory::NewOOBuyMF(unsigned short version) {
+    return Create<OEOOBuyMF>(version);
+}
+OEOOBuyOpt* OEDataObjFactory::NewOOBuyOpt(unsigned short version) {
+    return Create<OEOOBuyOpt>(version);
+}
+OEOOBuyOther* OEDataObjFactory::NewOOBuyOther(unsigned short version) {
+    return Create<OEOOBuyOther>(version);
+}
+OEOOBuyStock* OEDataObjFactory::NewOOBuyStock(unsigned short version) {
+    return Create<OEOOBuyStock>(version);
+}
+OEOOSellDebt* OEDataObjFactory::NewOOSellDebt(unsigned short version) {
+    return Create<OEOOSellDebt>(version);
+}
+OEOOSellMF* OEDataObjFactory::NewOOSellMF(unsigned short version) {
+    return Create<OEOOSellMF>(version);
+}
+OEOOSellOpt* OEDataObjFactory::NewOOSellOpt(unsigned short version) {
+    return Create<OEOOSellOpt>(version);
+}
+OEOOSellOther* OEDataObjFactory::NewOOSellOther(unsigned short version) {
+    return Create<OEOOSellOther>(version);
+}
+OEOOSellStock* OEDataObjFactory::NewOOSellStock(unsigned short version) {
+    return Create<OEOOSellStock>(version);
+}
+OEOOSwitchMF* OEDataObjFactory::NewOOSwitchMF(unsigned short version) {
+    return Create<OEOOSwitchMF>(version);
 }
 
 OEInvAcctFrom* OEDataObjFactory::NewInvAcctFrom(unsigned short version) {

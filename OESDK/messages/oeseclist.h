@@ -290,8 +290,7 @@ public:
     OEString32 m_typeDesc;
 };
 
-// SECLIST: any number of security descriptions of the five kinds, kept in one list in the order
-// they were read or appended, and written back in that order (a file may mix the kinds freely).
+// SECLIST: any number of security descriptions of the five kinds, in document order.
 class OE_API OESecList : public OEMixedList {
 public:
     explicit OESecList(unsigned short version = 0);
