@@ -94,6 +94,15 @@ struct OEAggregateDesc {
             static_cast<unsigned short>(sizeof(fields) / sizeof(fields[0]))                                  \
     }
 
+// The constructor and Describe of an aggregate class whose shape is the descriptor `desc`.
+#define OE_AGGREGATE_DEFINE(C, Base, desc, tag)                                                              \
+    C::C(unsigned short version) : Base(version) {                                                           \
+        SetType(tag);                                                                                        \
+    }                                                                                                        \
+    const OEAggregateDesc& C::Describe() const {                                                             \
+        return desc;                                                                                         \
+    }
+
 typedef OEPtrArray<OEDataObj> OEDataObjList;
 
 // The storage of a child row: one owned child, deleted with the member. (Standard layout with the

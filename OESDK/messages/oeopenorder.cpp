@@ -150,24 +150,16 @@ const OEAggregateDesc kListDesc = OE_DESC_NO_REQUIRED(OETAG_INVOOLIST, kListVali
 
 } // namespace
 
-#define OE_OPENORDER_CLASS(C, Base, desc, tag)                                                               \
-    C::C(unsigned short version) : Base(version) {                                                           \
-        SetType(tag);                                                                                        \
-    }                                                                                                        \
-    const OEAggregateDesc& C::Describe() const {                                                             \
-        return desc;                                                                                         \
-    }
-
-OE_OPENORDER_CLASS(OEOO, OEAggregate, kOODesc, OETAG_OO)
-OE_OPENORDER_CLASS(OEOOBuyDebt, OEOpenOrder, kBuyDebtDesc, OETAG_OOBUYDEBT)
-OE_OPENORDER_CLASS(OEOOBuyMF, OEOpenOrder, kBuyMFDesc, OETAG_OOBUYMF)
-OE_OPENORDER_CLASS(OEOOBuyOpt, OEOpenOrder, kBuyOptDesc, OETAG_OOBUYOPT)
-OE_OPENORDER_CLASS(OEOOBuyOther, OEOpenOrder, kBuyOtherDesc, OETAG_OOBUYOTHER)
-OE_OPENORDER_CLASS(OEOOBuyStock, OEOpenOrder, kBuyStockDesc, OETAG_OOBUYSTOCK)
-OE_OPENORDER_CLASS(OEOOSellDebt, OEOpenOrder, kSellDebtDesc, OETAG_OOSELLDEBT)
-OE_OPENORDER_CLASS(OEOOSellMF, OEOpenOrder, kSellMFDesc, OETAG_OOSELLMF)
-OE_OPENORDER_CLASS(OEOOSellOpt, OEOpenOrder, kSellOptDesc, OETAG_OOSELLOPT)
-OE_OPENORDER_CLASS(OEOOSellOther, OEOpenOrder, kSellOtherDesc, OETAG_OOSELLOTHER)
-OE_OPENORDER_CLASS(OEOOSellStock, OEOpenOrder, kSellStockDesc, OETAG_OOSELLSTOCK)
-OE_OPENORDER_CLASS(OEOOSwitchMF, OEOpenOrder, kSwitchDesc, OETAG_OOSWITCHMF)
-OE_OPENORDER_CLASS(OEInvOOList, OEMixedList, kListDesc, OETAG_INVOOLIST)
+OE_AGGREGATE_DEFINE(OEOO, OEAggregate, kOODesc, OETAG_OO)
+OE_AGGREGATE_DEFINE(OEOOBuyDebt, OEOpenOrder, kBuyDebtDesc, OETAG_OOBUYDEBT)
+OE_AGGREGATE_DEFINE(OEOOBuyMF, OEOpenOrder, kBuyMFDesc, OETAG_OOBUYMF)
+OE_AGGREGATE_DEFINE(OEOOBuyOpt, OEOpenOrder, kBuyOptDesc, OETAG_OOBUYOPT)
+OE_AGGREGATE_DEFINE(OEOOBuyOther, OEOpenOrder, kBuyOtherDesc, OETAG_OOBUYOTHER)
+OE_AGGREGATE_DEFINE(OEOOBuyStock, OEOpenOrder, kBuyStockDesc, OETAG_OOBUYSTOCK)
+OE_AGGREGATE_DEFINE(OEOOSellDebt, OEOpenOrder, kSellDebtDesc, OETAG_OOSELLDEBT)
+OE_AGGREGATE_DEFINE(OEOOSellMF, OEOpenOrder, kSellMFDesc, OETAG_OOSELLMF)
+OE_AGGREGATE_DEFINE(OEOOSellOpt, OEOpenOrder, kSellOptDesc, OETAG_OOSELLOPT)
+OE_AGGREGATE_DEFINE(OEOOSellOther, OEOpenOrder, kSellOtherDesc, OETAG_OOSELLOTHER)
+OE_AGGREGATE_DEFINE(OEOOSellStock, OEOpenOrder, kSellStockDesc, OETAG_OOSELLSTOCK)
+OE_AGGREGATE_DEFINE(OEOOSwitchMF, OEOpenOrder, kSwitchDesc, OETAG_OOSWITCHMF)
+OE_AGGREGATE_DEFINE(OEInvOOList, OEMixedList, kListDesc, OETAG_INVOOLIST)

@@ -205,29 +205,21 @@ const OEAggregateDesc kSecListRsDesc = {OETAG_SECLISTRS, kNoRows, 0, kNoRows, 0,
 
 } // namespace
 
-#define OE_SECLIST_CLASS(C, Base, desc, tag)                                                                 \
-    C::C(unsigned short version) : Base(version) {                                                           \
-        SetType(tag);                                                                                        \
-    }                                                                                                        \
-    const OEAggregateDesc& C::Describe() const {                                                             \
-        return desc;                                                                                         \
-    }
-
-OE_SECLIST_CLASS(OESecID, OEAggregate, kSecIdDesc, OETAG_SECID)
-OE_SECLIST_CLASS(OESecInfo, OEAggregate, kSecInfoDesc, OETAG_SECINFO)
-OE_SECLIST_CLASS(OEDebtInfo, OESecurityInfo, kDebtDesc, OETAG_DEBTINFO)
-OE_SECLIST_CLASS(OEPortion, OEAggregate, kPortionDesc, OETAG_PORTION)
-OE_SECLIST_CLASS(OEFIPortion, OEAggregate, kFIPortionDesc, OETAG_FIPORTION)
-OE_SECLIST_CLASS(OEMFAssetClass, OEAggregate, kMFAssetDesc, OETAG_MFASSETCLASS)
-OE_SECLIST_CLASS(OEFIMFAssetClass, OEAggregate, kFIMFAssetDesc, OETAG_FIMFASSETCLASS)
-OE_SECLIST_CLASS(OEMFInfo, OESecurityInfo, kMFDesc, OETAG_MFINFO)
-OE_SECLIST_CLASS(OEOptInfo, OESecurityInfo, kOptDesc, OETAG_OPTINFO)
-OE_SECLIST_CLASS(OEOtherInfo, OESecurityInfo, kOtherDesc, OETAG_OTHERINFO)
-OE_SECLIST_CLASS(OEStockInfo, OESecurityInfo, kStockDesc, OETAG_STOCKINFO)
-OE_SECLIST_CLASS(OESecList, OEMixedList, kSecListDesc, OETAG_SECLIST)
-OE_SECLIST_CLASS(OESecRq, OEAggregate, kSecRqDesc, OETAG_SECRQ)
-OE_SECLIST_CLASS(OESecListRq, OETransBase, kSecListRqDesc, OETAG_SECLISTRQ)
-OE_SECLIST_CLASS(OESecListRs, OETransBase, kSecListRsDesc, OETAG_SECLISTRS)
+OE_AGGREGATE_DEFINE(OESecID, OEAggregate, kSecIdDesc, OETAG_SECID)
+OE_AGGREGATE_DEFINE(OESecInfo, OEAggregate, kSecInfoDesc, OETAG_SECINFO)
+OE_AGGREGATE_DEFINE(OEDebtInfo, OESecurityInfo, kDebtDesc, OETAG_DEBTINFO)
+OE_AGGREGATE_DEFINE(OEPortion, OEAggregate, kPortionDesc, OETAG_PORTION)
+OE_AGGREGATE_DEFINE(OEFIPortion, OEAggregate, kFIPortionDesc, OETAG_FIPORTION)
+OE_AGGREGATE_DEFINE(OEMFAssetClass, OEAggregate, kMFAssetDesc, OETAG_MFASSETCLASS)
+OE_AGGREGATE_DEFINE(OEFIMFAssetClass, OEAggregate, kFIMFAssetDesc, OETAG_FIMFASSETCLASS)
+OE_AGGREGATE_DEFINE(OEMFInfo, OESecurityInfo, kMFDesc, OETAG_MFINFO)
+OE_AGGREGATE_DEFINE(OEOptInfo, OESecurityInfo, kOptDesc, OETAG_OPTINFO)
+OE_AGGREGATE_DEFINE(OEOtherInfo, OESecurityInfo, kOtherDesc, OETAG_OTHERINFO)
+OE_AGGREGATE_DEFINE(OEStockInfo, OESecurityInfo, kStockDesc, OETAG_STOCKINFO)
+OE_AGGREGATE_DEFINE(OESecList, OEMixedList, kSecListDesc, OETAG_SECLIST)
+OE_AGGREGATE_DEFINE(OESecRq, OEAggregate, kSecRqDesc, OETAG_SECRQ)
+OE_AGGREGATE_DEFINE(OESecListRq, OETransBase, kSecListRqDesc, OETAG_SECLISTRQ)
+OE_AGGREGATE_DEFINE(OESecListRs, OETransBase, kSecListRsDesc, OETAG_SECLISTRS)
 
 OECouponFreq OEDebtInfo::GetCouponFreq() const {
     unsigned long v = GetNumber(OETAG_COUPONFREQ);
