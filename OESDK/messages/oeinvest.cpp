@@ -49,7 +49,6 @@ const OEFieldRow kRqFields[] = {
 };
 
 // ---- INVSTMTRS ----
-// INVOOLIST has its place in the valid rows (and its member) ahead of its field row.
 const OETagRow kRsValid[] = {V(DTASOF),     V(CURDEF), V(INVACCTFROM), V(INVTRANLIST),
                              V(INVPOSLIST), V(INVBAL), V(INVOOLIST),   V(MKTGINFO)};
 const OETagRow kRsRequired[] = {V(DTASOF), V(CURDEF), V(INVACCTFROM)};
@@ -60,6 +59,7 @@ const OEFieldRow kRsFields[] = {
     CHILD(OEInvStmtRs, INVTRANLIST, m_tranList, NewInvTranList),
     CHILD(OEInvStmtRs, INVPOSLIST, m_posList, NewInvPosList),
     CHILD(OEInvStmtRs, INVBAL, m_invBal, NewInvBal),
+    CHILD(OEInvStmtRs, INVOOLIST, m_ooList, NewInvOOList),
     TEXT(OEInvStmtRs, MKTGINFO, m_mktgInfo),
 };
 

@@ -9,6 +9,7 @@
 #include "foundation/oeenums.h"
 #include "messages/oeaccount.h"
 #include "messages/oebank.h"
+#include "messages/oeopenorder.h"
 #include "messages/oeseclist.h"
 
 // INVACCTFROM: BROKERID and ACCTID, both required.
@@ -388,6 +389,8 @@ public:
     unsigned short SetPosList(OEInvPosList* l) { return SetChildObj(OETAG_INVPOSLIST, l); }
     OEInvBal* GetInvBal() const { return static_cast<OEInvBal*>(GetChildObj(OETAG_INVBAL)); }
     unsigned short SetInvBal(OEInvBal* b) { return SetChildObj(OETAG_INVBAL, b); }
+    OEInvOOList* GetOOList() const { return static_cast<OEInvOOList*>(GetChildObj(OETAG_INVOOLIST)); }
+    unsigned short SetOOList(OEInvOOList* l) { return SetChildObj(OETAG_INVOOLIST, l); }
 
     OEDateTime m_dtAsOf;
     OEString3 m_curDef;

@@ -191,6 +191,23 @@ const CorpusCase kCorpus[] = {
      {},
      {},
      "INVBAL cash=3118 margin=2360 short=2408 bals=3"},
+    // Two printings of the same sample statement, with one open order each.
+    {"ofxtools/invstmtrs.ofx",
+     OEPS_OK,
+     "121099999/999988",
+     2,
+     2,
+     {},
+     {},
+     "INVBAL cash=200.00 margin=-50.00 short=0 bals=1"},
+    {"libofx/ofx-2.1.1-sect-13.12.ofx",
+     OEPS_OK,
+     "121099999/999988",
+     2,
+     2,
+     {},
+     {},
+     "INVBAL cash=200.00 margin=-50.00 short=0 bals=1"},
 };
 
 TEST(InvestCorpus, ReadsAsWrittenAndRoundTripsInBothForms) {
@@ -224,6 +241,8 @@ TEST(InvestCorpus, ReadsAsWrittenAndRoundTripsInBothForms) {
             EXPECT_EQ(std::to_string(i) + ": " + DescribePos(poss->GetPosition(i)), line);
         }
         EXPECT_EQ(DescribeBal(st->GetInvBal()), c.balance);
+        const bool hasOrders = text.find("<INVOOLIST>") != std::string::npos;
+        EXPECT_EQ(st->GetOOList() ? st->GetOOList()->GetNumOpenOrder() : 0, hasOrders ? 1 : 0);
 
         std::string canonical = BuildText(file.get());
         EXPECT_EQ(KindsInOrder(canonical, "INVTRANLIST", kTxKinds),
