@@ -47,6 +47,12 @@ def public_declarations():
                 continue
             with open(os.path.join(root, f), encoding="utf-8", errors="replace") as h:
                 text = h.read()
+            # A macro that declares an OE_API class from its first parameter (a family of classes
+            # with the same shape): each use declares that class.
+            for macro, param, body in re.findall(r"#define\s+(\w+)\(\s*(\w+)[^)]*\)((?:[^\n]*\\\n)*[^\n]*)",
+                                                 text):
+                if re.search(r"\b(?:class|struct)\s+OE_API\s+" + param + r"\b", body):
+                    classes.update(re.findall(r"^\s*" + macro + r"\(\s*(\w+)", text, flags=re.M))
             text = re.sub(r"/\*.*?\*/", " ", text, flags=re.S)
             text = re.sub(r"//[^\n]*", " ", text)
             text = re.sub(r"^\s*#[^\n]*", " ", text, flags=re.M)
