@@ -445,20 +445,28 @@ OEBuildStatus OEBuilder::AddKeywordString(unsigned short converted, const OEStri
         OEString text;                                                                                       \
         return Emit(OEDataConversion::Stem##ToString(value, text), text);                                    \
     }
+// The same for a keyword appended directly: the text is one per thread, kept between calls (the
+// append calls nothing virtual, so no other writer can run while it is in use), so a keyword
+// costs no allocation.
+#define OE_KEYWORD_LINE_WRITER(Writer, Param, Stem)                                                          \
+    OEBuildStatus OEBuilder::Writer(Param value) {                                                           \
+        static thread_local OEString text;                                                                   \
+        return PutKeywordLine(OEDataConversion::Stem##ToString(value, text), text);                          \
+    }
 
-OE_KEYWORD_WRITER(AddBankTxType, OEBankTxType, BankTx, PutKeywordLine)
-OE_KEYWORD_WRITER(AddBankAction, OEBankAction, BankAction, PutKeywordLine)
-OE_KEYWORD_WRITER(AddProcCode, OEProcCode, ProcCode, PutKeywordLine)
-OE_KEYWORD_WRITER(AddDayOfWeek, OEDayOfWeek, DayOfWeek, PutKeywordLine)
-OE_KEYWORD_WRITER(AddClientRouting, OEClientRouting, ClientRouting, PutKeywordLine)
-OE_KEYWORD_WRITER(AddOFXSecurity, OEOFXSecurity, OFXSecurity, PutKeywordLine)
-OE_KEYWORD_WRITER(AddSyncMode, OESyncMode, SyncMode, PutKeywordLine)
+OE_KEYWORD_LINE_WRITER(AddBankTxType, OEBankTxType, BankTx)
+OE_KEYWORD_LINE_WRITER(AddBankAction, OEBankAction, BankAction)
+OE_KEYWORD_LINE_WRITER(AddProcCode, OEProcCode, ProcCode)
+OE_KEYWORD_LINE_WRITER(AddDayOfWeek, OEDayOfWeek, DayOfWeek)
+OE_KEYWORD_LINE_WRITER(AddClientRouting, OEClientRouting, ClientRouting)
+OE_KEYWORD_LINE_WRITER(AddOFXSecurity, OEOFXSecurity, OFXSecurity)
+OE_KEYWORD_LINE_WRITER(AddSyncMode, OESyncMode, SyncMode)
 OE_KEYWORD_WRITER(AddCharacterType, OECharacterType, CharacterType, AddKeywordString)
-OE_KEYWORD_WRITER(AddBankAccountType, OEBankAccountType, BankAccount, PutKeywordLine)
-OE_KEYWORD_WRITER(AddService, OEService, Service, PutKeywordLine)
-OE_KEYWORD_WRITER(AddService2, OEService2, Service2, PutKeywordLine)
-OE_KEYWORD_WRITER(AddServiceStatus, OEServiceStatus, ServiceStatus, PutKeywordLine)
-OE_KEYWORD_WRITER(AddServiceStatus2, OEServiceStatus2, ServiceStatus2, PutKeywordLine)
+OE_KEYWORD_LINE_WRITER(AddBankAccountType, OEBankAccountType, BankAccount)
+OE_KEYWORD_LINE_WRITER(AddService, OEService, Service)
+OE_KEYWORD_LINE_WRITER(AddService2, OEService2, Service2)
+OE_KEYWORD_LINE_WRITER(AddServiceStatus, OEServiceStatus, ServiceStatus)
+OE_KEYWORD_LINE_WRITER(AddServiceStatus2, OEServiceStatus2, ServiceStatus2)
 
 OE_KEYWORD_WRITER(AddBuyType, const OEBuyType&, BuyType, AddKeywordString)
 OE_KEYWORD_WRITER(AddCallType, const OECallType&, CallType, AddKeywordString)
