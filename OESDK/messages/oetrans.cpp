@@ -510,10 +510,9 @@ OEParseStatus OETransWrapper::NewInner(OETagID tag, OETagID efileTag) {
     return OEPS_OK;
 }
 
-OEParseStatus OETransWrapper::StartInner(const OETagDictionaryEntry* entry, OETagID efileTag) {
-    OEParseStatus status = NewInner(entry->m_id, efileTag);
-    if (status != OEPS_OK) return status;
-    return PushAndSetObject(m_actual.get(), entry->m_id);
+OEParseStatus OETransWrapper::PushInner(OEParseStatus created, OETagID tag) {
+    if (created != OEPS_OK) return created;
+    return PushAndSetObject(m_actual.get(), tag);
 }
 
 // ---------------------------------------------------------------- OETransRq
@@ -531,7 +530,7 @@ OETagID OETransRq::MsgIDToTranWrapper(OETagID tag) {
 
 OEParseStatus OETransRq::HandleTagStart(const OETagDictionaryEntry* entry) {
     if (!entry) return OEPS_INVALID;
-    return StartInner(entry, OETAG_K_EFILERQ);
+    return PushInner(NewRq(entry->m_id), entry->m_id);
 }
 
 unsigned short OETransRq::AllRequiredPresent() {
@@ -571,7 +570,7 @@ OEParseStatus OETransRs::HandleTagStart(const OETagDictionaryEntry* entry) {
         if (!IsValidTag(entry->m_id)) return OEPS_INVALID;
         return StartChild(FindRow(entry->m_id), entry);
     }
-    return StartInner(entry, OETAG_K_EFILERS);
+    return PushInner(NewRs(entry->m_id), entry->m_id);
 }
 
 unsigned short OETransRs::AllRequiredPresent() {

@@ -86,8 +86,8 @@ protected:
     // or memory, 4 for a tag without a class (yet); efileTag (K.EFILERQ or K.EFILERS) succeeds
     // only when an inner aggregate is held.
     OEParseStatus NewInner(OETagID tag, OETagID efileTag);
-    // NewInner, then the inner aggregate is the object being parsed.
-    OEParseStatus StartInner(const OETagDictionaryEntry* entry, OETagID efileTag);
+    // After NewRq / NewRs made the inner aggregate (`created` 0), it becomes the object being parsed.
+    OEParseStatus PushInner(OEParseStatus created, OETagID tag);
 };
 
 // Every transaction request wrapper; its own tag says which one.
@@ -110,6 +110,13 @@ public:
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
 
+protected:
+    // Creates the inner request for a start tag through the factory and keeps it as the actual
+    // transaction: 0, 3 without a factory or memory, 4 for a tag with no inner class here.
+    // K.EFILERQ creates nothing: 0 when an actual transaction is already held, else 3.
+    OEParseStatus NewRq(OETagID tag) { return NewInner(tag, OETAG_K_EFILERQ); }
+
+public:
     unsigned short m_syncCompleteInfo = 0;
     OEBoundedString<80> m_tan;
 };
@@ -135,6 +142,11 @@ public:
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     unsigned short AllRequiredPresent() override;
 
+protected:
+    // The response side of OETransRq::NewRq, by the inner response tag.
+    OEParseStatus NewRs(OETagID tag) { return NewInner(tag, OETAG_K_EFILERS); }
+
+public:
     OEOwnedChild m_status, m_warning;
 };
 

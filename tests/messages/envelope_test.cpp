@@ -294,6 +294,25 @@ TEST(TransactionWrappers, InnerTagsWithoutAClassAnswerFour) {
     EXPECT_EQ(status, OEPS_INVALID);
 }
 
+// White-box: the wrapper's own creation step, including the e-file tag that creates nothing.
+class InnerProbe : public OETransRq {
+public:
+    using OETransRq::NewRq;
+};
+
+TEST(TransactionWrappers, NewRqCreatesKnownInnersAndTheEFileTagOnlyFollowsOne) {
+    InnerProbe wrapper;
+    wrapper.SetMsgSetVersion(1);
+    wrapper.SetType(OETAG_STMTTRNRQ);
+    EXPECT_EQ(wrapper.NewRq(OETAG_K_EFILERQ), OEPS_NORESOURCE) << "nothing held yet";
+    EXPECT_EQ(wrapper.NewRq(OETAG_INVMAILRQ), OEPS_INVALID) << "no class for it";
+    EXPECT_EQ(wrapper.GetActualTrans(), nullptr);
+    ASSERT_EQ(wrapper.NewRq(OETAG_STMTRQ), OEPS_OK);
+    ASSERT_NE(wrapper.GetActualTrans(), nullptr);
+    EXPECT_EQ(wrapper.GetActualTrans()->GetType(), OETAG_STMTRQ);
+    EXPECT_EQ(wrapper.NewRq(OETAG_K_EFILERQ), OEPS_OK);
+}
+
 TEST(Sync, ChoiceRules) {
     struct Row {
         std::vector<OETagID> marks;
