@@ -15,10 +15,8 @@ public:
     void NewAcctTo() { SetType(ToTag()); }
     virtual OETagID FromTag() const = 0;
     virtual OETagID ToTag() const = 0;
-    const OEString* GetAcctId() const { return GetText(OETAG_ACCTID); }
-    unsigned short SetAcctId(const OEString& v) { return SetFromText(OETAG_ACCTID, v); }
-    const OEString* GetAcctKey() const { return GetText(OETAG_ACCTKEY); }
-    unsigned short SetAcctKey(const OEString& v) { return SetFromText(OETAG_ACCTKEY, v); }
+    OE_TEXT_ACCESSORS(AcctId, OETAG_ACCTID);
+    OE_TEXT_ACCESSORS(AcctKey, OETAG_ACCTKEY);
 };
 
 class OE_API OEBankOrCCAccount : public OEAccount {
@@ -33,18 +31,12 @@ public:
     const OEAggregateDesc& Describe() const override;
     OETagID FromTag() const override { return OETAG_BANKACCTFROM; }
     OETagID ToTag() const override { return OETAG_BANKACCTTO; }
-    const OEString* GetBankId() const { return GetText(OETAG_BANKID); }
-    unsigned short SetBankId(const OEString& v) { return SetFromText(OETAG_BANKID, v); }
-    const OEString* GetBranchId() const { return GetText(OETAG_BRANCHID); }
-    unsigned short SetBranchId(const OEString& v) { return SetFromText(OETAG_BRANCHID, v); }
+    OE_TEXT_ACCESSORS(BankId, OETAG_BANKID);
+    OE_TEXT_ACCESSORS(BranchId, OETAG_BRANCHID);
     // ACCTTYPE (version 1) as an index of OEKW_BANKACCOUNTTYPE.
-    unsigned short GetAcctType() const { return static_cast<unsigned short>(GetNumber(OETAG_ACCTTYPE)); }
-    unsigned short SetAcctType(const OEString& v) { return SetFromText(OETAG_ACCTTYPE, v); }
-    unsigned short SetAcctType(unsigned short v) { return SetNumber(OETAG_ACCTTYPE, v); }
+    OE_NUMBER_ACCESSORS(AcctType, unsigned short, OETAG_ACCTTYPE);
     // ACCTTYPE2 (every version but 1) as an index of OEKW_BANKACCOUNTTYPE2.
-    unsigned short GetAcctType2() const { return static_cast<unsigned short>(GetNumber(OETAG_ACCTTYPE2)); }
-    unsigned short SetAcctType2(const OEString& v) { return SetFromText(OETAG_ACCTTYPE2, v); }
-    unsigned short SetAcctType2(unsigned short v) { return SetNumber(OETAG_ACCTTYPE2, v); }
+    OE_NUMBER_ACCESSORS(AcctType2, unsigned short, OETAG_ACCTTYPE2);
     // The account type's keyword whichever element holds it, or null.
     const char* GetAcctTypeText() const;
 
@@ -68,12 +60,8 @@ class OE_API OEBankBalance : public OEAggregate {
 public:
     explicit OEBankBalance(unsigned short version = 0) : OEAggregate(version) {}
     const OEAggregateDesc& Describe() const override;
-    const OEPrecisionInteger* GetBalanceAmount() const { return GetAmount(OETAG_BALAMT); }
-    unsigned short SetBalanceAmount(const OEString& v) { return SetFromText(OETAG_BALAMT, v); }
-    unsigned short SetBalanceAmount(const OEPrecisionInteger& v) { return SetAmount(OETAG_BALAMT, v); }
-    const OEDateTime* GetDateAsOf() const { return GetDateTime(OETAG_DTASOF); }
-    unsigned short SetDateAsOf(const OEString& v) { return SetFromText(OETAG_DTASOF, v); }
-    unsigned short SetDateAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTASOF, v); }
+    OE_AMOUNT_ACCESSORS(BalanceAmount, OETAG_BALAMT);
+    OE_DATE_ACCESSORS(DateAsOf, OETAG_DTASOF);
 
     OEPrecisionInteger m_balAmt;
     OEDateTime m_dtAsOf;
@@ -98,20 +86,13 @@ class OE_API OEBalance : public OEAggregate {
 public:
     explicit OEBalance(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetName() const { return GetText(OETAG_NAME); }
-    unsigned short SetName(const OEString& v) { return SetFromText(OETAG_NAME, v); }
-    const OEString* GetDescription() const { return GetText(OETAG_DESC); }
-    unsigned short SetDescription(const OEString& v) { return SetFromText(OETAG_DESC, v); }
-    unsigned short GetBalanceType() const { return static_cast<unsigned short>(GetNumber(OETAG_BALTYPE)); }
-    unsigned short SetBalanceType(const OEString& v) { return SetFromText(OETAG_BALTYPE, v); }
-    unsigned short SetBalanceType(unsigned short v) { return SetNumber(OETAG_BALTYPE, v); }
-    const OEPrecisionInteger* GetValue() const { return GetAmount(OETAG_VALUE); }
-    unsigned short SetValue(const OEString& v) { return SetFromText(OETAG_VALUE, v); }
-    unsigned short SetValue(const OEPrecisionInteger& v) { return SetAmount(OETAG_VALUE, v); }
-    const OEDateTime* GetDateAsOf() const { return GetDateTime(OETAG_DTASOF); }
-    unsigned short SetDateAsOf(const OEString& v) { return SetFromText(OETAG_DTASOF, v); }
+    OE_TEXT_ACCESSORS(Name, OETAG_NAME);
+    OE_TEXT_ACCESSORS(Description, OETAG_DESC);
+    OE_NUMBER_ACCESSORS(BalanceType, unsigned short, OETAG_BALTYPE);
+    OE_AMOUNT_ACCESSORS(Value, OETAG_VALUE);
+    OE_DATE_TEXT_ACCESSORS(DateAsOf, OETAG_DTASOF);
     OEDataObj* GetCurrency() const { return GetChildObj(OETAG_CURRENCY); }
-    unsigned short SetCurrency(OEDataObj* c) { return SetChildObj(OETAG_CURRENCY, c); }
+    OE_SET_CHILD(Currency, OEDataObj, OETAG_CURRENCY);
 
     OEString32 m_name;
     OEBoundedString<80> m_desc;
@@ -126,18 +107,12 @@ class OE_API OEPayee : public OEAggregate {
 public:
     explicit OEPayee(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetName() const { return GetText(OETAG_NAME); }
-    unsigned short SetName(const OEString& v) { return SetFromText(OETAG_NAME, v); }
-    const OEString* GetAddr1() const { return GetText(OETAG_ADDR1); }
-    unsigned short SetAddr1(const OEString& v) { return SetFromText(OETAG_ADDR1, v); }
-    const OEString* GetCity() const { return GetText(OETAG_CITY); }
-    unsigned short SetCity(const OEString& v) { return SetFromText(OETAG_CITY, v); }
-    const OEString* GetState() const { return GetText(OETAG_STATE); }
-    unsigned short SetState(const OEString& v) { return SetFromText(OETAG_STATE, v); }
-    const OEString* GetPostalCode() const { return GetText(OETAG_POSTALCODE); }
-    unsigned short SetPostalCode(const OEString& v) { return SetFromText(OETAG_POSTALCODE, v); }
-    const OEString* GetPhone() const { return GetText(OETAG_PHONE); }
-    unsigned short SetPhone(const OEString& v) { return SetFromText(OETAG_PHONE, v); }
+    OE_TEXT_ACCESSORS(Name, OETAG_NAME);
+    OE_TEXT_ACCESSORS(Addr1, OETAG_ADDR1);
+    OE_TEXT_ACCESSORS(City, OETAG_CITY);
+    OE_TEXT_ACCESSORS(State, OETAG_STATE);
+    OE_TEXT_ACCESSORS(PostalCode, OETAG_POSTALCODE);
+    OE_TEXT_ACCESSORS(Phone, OETAG_PHONE);
 
     OEString32 m_name, m_addr1, m_addr2, m_addr3, m_city, m_phone;
     OEBoundedString<5> m_state;

@@ -253,4 +253,123 @@ public:
     OEDataObjList m_entries;
 };
 
+// ---- Named accessors ----
+// A class states its named accessors one element a line, through the macros below: `Name` is the
+// accessor's name without Get / Set, `tag` the element's tag. Each expands to inline one-liners
+// over the typed helpers of OEAggregate (nothing virtual, nothing exported of its own), written
+// with `this->` so that class templates over an aggregate base can use them too. An invocation
+// ends with a semicolon, like a declaration.
+//
+// The families: a getter, the setter from the element's text (converted as the parser converts
+// it: a refused text is logged and marks nothing) and the setter from the typed value.
+//   OE_TEXT_ACCESSORS(Name, tag)          const OEString* GetName() const (null when absent);
+//                                         SetName(const OEString&)
+//   OE_DATE_ACCESSORS(Name, tag)          the same with const OEDateTime*; + SetName(const OEDateTime&)
+//   OE_AMOUNT_ACCESSORS(Name, tag)        the same with const OEPrecisionInteger*; + SetName(that)
+//   OE_NUMBER_ACCESSORS(Name, Type, tag)  an enumeration index, count or Y/N flag as Type (unsigned
+//                                         short, unsigned long, bool or an OE... enumeration; 0 when
+//                                         absent); + SetName(Type)
+//   OE_CHILD_ACCESSORS(Name, Type, tag)   Type* GetName() (null when absent); SetName(Type*), which
+//                                         replaces and deletes the held child (null only clears)
+// The partial families OE_DATE_TEXT_ / OE_AMOUNT_TEXT_ACCESSORS (no typed setter) and
+// OE_AMOUNT_VALUE_ / OE_NUMBER_VALUE_ACCESSORS (no text setter) serve the classes that offer less;
+// an accessor alone is one of the pieces (OE_GET_..., OE_SET_...), and one with behaviour of its
+// own is written out by hand.
+#define OE_GET_TEXT(Name, tag)                                                                               \
+    const OEString* Get##Name() const {                                                                      \
+        return this->GetText(tag);                                                                           \
+    }
+#define OE_GET_DATE(Name, tag)                                                                               \
+    const OEDateTime* Get##Name() const {                                                                    \
+        return this->GetDateTime(tag);                                                                       \
+    }
+#define OE_GET_AMOUNT(Name, tag)                                                                             \
+    const OEPrecisionInteger* Get##Name() const {                                                            \
+        return this->GetAmount(tag);                                                                         \
+    }
+#define OE_GET_NUMBER(Name, Type, tag)                                                                       \
+    Type Get##Name() const {                                                                                 \
+        return static_cast<Type>(this->GetNumber(tag));                                                      \
+    }
+#define OE_GET_CHILD(Name, Type, tag)                                                                        \
+    Type* Get##Name() const {                                                                                \
+        return static_cast<Type*>(this->GetChildObj(tag));                                                   \
+    }
+#define OE_SET_FROM_TEXT(Name, tag)                                                                          \
+    unsigned short Set##Name(const OEString& v) {                                                            \
+        return this->SetFromText(tag, v);                                                                    \
+    }
+#define OE_SET_DATE(Name, tag)                                                                               \
+    unsigned short Set##Name(const OEDateTime& v) {                                                          \
+        return this->SetDateTime(tag, v);                                                                    \
+    }
+#define OE_SET_AMOUNT(Name, tag)                                                                             \
+    unsigned short Set##Name(const OEPrecisionInteger& v) {                                                  \
+        return this->SetAmount(tag, v);                                                                      \
+    }
+#define OE_SET_NUMBER(Name, Type, tag)                                                                       \
+    unsigned short Set##Name(Type v) {                                                                       \
+        return this->SetNumber(tag, static_cast<unsigned long>(v));                                          \
+    }
+#define OE_SET_CHILD(Name, Type, tag)                                                                        \
+    unsigned short Set##Name(Type* v) {                                                                      \
+        return this->SetChildObj(tag, v);                                                                    \
+    }
+
+#define OE_TEXT_ACCESSORS(Name, tag) OE_GET_TEXT(Name, tag) OE_SET_FROM_TEXT(Name, tag)
+#define OE_DATE_ACCESSORS(Name, tag) OE_DATE_TEXT_ACCESSORS(Name, tag) OE_SET_DATE(Name, tag)
+#define OE_AMOUNT_ACCESSORS(Name, tag) OE_AMOUNT_TEXT_ACCESSORS(Name, tag) OE_SET_AMOUNT(Name, tag)
+#define OE_NUMBER_ACCESSORS(Name, Type, tag)                                                                 \
+    OE_NUMBER_VALUE_ACCESSORS(Name, Type, tag) OE_SET_FROM_TEXT(Name, tag)
+// The partial families: the getter with the text setter only, or with the typed setter only.
+#define OE_DATE_TEXT_ACCESSORS(Name, tag) OE_GET_DATE(Name, tag) OE_SET_FROM_TEXT(Name, tag)
+#define OE_AMOUNT_TEXT_ACCESSORS(Name, tag) OE_GET_AMOUNT(Name, tag) OE_SET_FROM_TEXT(Name, tag)
+#define OE_AMOUNT_VALUE_ACCESSORS(Name, tag) OE_GET_AMOUNT(Name, tag) OE_SET_AMOUNT(Name, tag)
+#define OE_NUMBER_VALUE_ACCESSORS(Name, Type, tag)                                                           \
+    OE_GET_NUMBER(Name, Type, tag) OE_SET_NUMBER(Name, Type, tag)
+#define OE_CHILD_ACCESSORS(Name, Type, tag) OE_GET_CHILD(Name, Type, tag) OE_SET_CHILD(Name, Type, tag)
+
+// A list row held in the member `list` (an OEDataObjList): AppendName(Type*) (the list owns the
+// entry afterwards), GetName(index) (null past the end) and GetNumName().
+#define OE_LIST_ACCESSORS(Name, Type, tag, list)                                                             \
+    unsigned short Append##Name(Type* v) {                                                                   \
+        return this->AppendToList(tag, v);                                                                   \
+    }                                                                                                        \
+    Type* Get##Name(unsigned short index) const {                                                            \
+        return static_cast<Type*>(list.Get(index));                                                          \
+    }                                                                                                        \
+    unsigned short GetNum##Name() const {                                                                    \
+        return list.Entries();                                                                               \
+    }
+// The entries of an OEMixedList seen as Type: AppendName (0 for null or a kind without a row; the
+// caller keeps it), GetName(index), GetNumName() and DeleteAllName().
+#define OE_ENTRY_ACCESSORS(Name, Type)                                                                       \
+    unsigned short Append##Name(Type* v) {                                                                   \
+        return this->AppendEntry(v);                                                                         \
+    }                                                                                                        \
+    Type* Get##Name(unsigned short index) const {                                                            \
+        return static_cast<Type*>(this->m_entries.Get(index));                                               \
+    }                                                                                                        \
+    unsigned short GetNum##Name() const {                                                                    \
+        return this->m_entries.Entries();                                                                    \
+    }                                                                                                        \
+    void DeleteAll##Name() {                                                                                 \
+        this->DeleteAllEntries();                                                                            \
+    }
+// A repeated element kept in the OEDynamicArrayString `list`: AppendName(text), GetName(index),
+// GetNumName() and DeleteAllName().
+#define OE_TEXTLIST_ACCESSORS(Name, tag, list)                                                               \
+    unsigned short Append##Name(const OEString& v) {                                                         \
+        return this->AppendText(tag, v);                                                                     \
+    }                                                                                                        \
+    const OEString* Get##Name(unsigned short i) const {                                                      \
+        return list.GetString(i);                                                                            \
+    }                                                                                                        \
+    unsigned short GetNum##Name() const {                                                                    \
+        return list.Entries();                                                                               \
+    }                                                                                                        \
+    void DeleteAll##Name() {                                                                                 \
+        list.DeleteAll();                                                                                    \
+    }
+
 #endif

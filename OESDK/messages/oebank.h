@@ -14,56 +14,30 @@ public:
     unsigned short AllRequiredPresent() override;
 
     // TRNTYPE as an index of OEKW_BANKTXTYPE.
-    unsigned short GetTxType() const { return static_cast<unsigned short>(GetNumber(OETAG_TRNTYPE)); }
+    OE_NUMBER_ACCESSORS(TxType, unsigned short, OETAG_TRNTYPE);
     const char* GetTxTypeText() const;
-    unsigned short SetTxType(const OEString& v) { return SetFromText(OETAG_TRNTYPE, v); }
-    unsigned short SetTxType(unsigned short v) { return SetNumber(OETAG_TRNTYPE, v); }
-    const OEDateTime* GetDateTimePosted() const { return GetDateTime(OETAG_DTPOSTED); }
-    unsigned short SetDateTimePosted(const OEString& v) { return SetFromText(OETAG_DTPOSTED, v); }
-    unsigned short SetDateTimePosted(const OEDateTime& v) { return SetDateTime(OETAG_DTPOSTED, v); }
-    const OEDateTime* GetDateTimeUser() const { return GetDateTime(OETAG_DTUSER); }
-    unsigned short SetDateTimeUser(const OEString& v) { return SetFromText(OETAG_DTUSER, v); }
-    unsigned short SetDateTimeUser(const OEDateTime& v) { return SetDateTime(OETAG_DTUSER, v); }
-    const OEDateTime* GetDateTimeAvailable() const { return GetDateTime(OETAG_DTAVAIL); }
-    unsigned short SetDateTimeAvailable(const OEString& v) { return SetFromText(OETAG_DTAVAIL, v); }
-    unsigned short SetDateTimeAvailable(const OEDateTime& v) { return SetDateTime(OETAG_DTAVAIL, v); }
-    const OEPrecisionInteger* GetTxAmount() const { return GetAmount(OETAG_TRNAMT); }
-    unsigned short SetTxAmount(const OEString& v) { return SetFromText(OETAG_TRNAMT, v); }
-    unsigned short SetTxAmount(const OEPrecisionInteger& v) { return SetAmount(OETAG_TRNAMT, v); }
-    const OEString* GetFITId() const { return GetText(OETAG_FITID); }
-    unsigned short SetFITId(const OEString& v) { return SetFromText(OETAG_FITID, v); }
-    const OEString* GetCorrectedFITId() const { return GetText(OETAG_CORRECTFITID); }
-    unsigned short SetCorrectedFITId(const OEString& v) { return SetFromText(OETAG_CORRECTFITID, v); }
-    unsigned short GetCorrectAction() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_CORRECTACTION));
-    }
-    unsigned short SetCorrectAction(const OEString& v) { return SetFromText(OETAG_CORRECTACTION, v); }
-    unsigned short SetCorrectAction(unsigned short v) { return SetNumber(OETAG_CORRECTACTION, v); }
-    const OEString* GetServerTxId() const { return GetText(OETAG_SRVRTID); }
-    unsigned short SetServerTxId(const OEString& v) { return SetFromText(OETAG_SRVRTID, v); }
-    const OEString* GetServerTxId2() const { return GetText(OETAG_SRVRTID2); }
-    unsigned short SetServerTxId2(const OEString& v) { return SetFromText(OETAG_SRVRTID2, v); }
-    const OEString* GetCheckNum() const { return GetText(OETAG_CHECKNUM); }
-    unsigned short SetCheckNum(const OEString& v) { return SetFromText(OETAG_CHECKNUM, v); }
-    const OEString* GetReferenceNum() const { return GetText(OETAG_REFNUM); }
-    unsigned short SetReferenceNum(const OEString& v) { return SetFromText(OETAG_REFNUM, v); }
-    const OEString* GetSIC() const { return GetText(OETAG_SIC); }
-    unsigned short SetSIC(const OEString& v) { return SetFromText(OETAG_SIC, v); }
-    const OEString* GetPayeeId() const { return GetText(OETAG_PAYEEID); }
-    unsigned short SetPayeeId(const OEString& v) { return SetFromText(OETAG_PAYEEID, v); }
-    const OEString* GetPayeeId2() const { return GetText(OETAG_PAYEEID2); }
-    unsigned short SetPayeeId2(const OEString& v) { return SetFromText(OETAG_PAYEEID2, v); }
-    const OEString* GetName() const { return GetText(OETAG_NAME); }
-    unsigned short SetName(const OEString& v) { return SetFromText(OETAG_NAME, v); }
-    const OEString* GetMemo() const { return GetText(OETAG_MEMO); }
-    unsigned short SetMemo(const OEString& v) { return SetFromText(OETAG_MEMO, v); }
-    const OEString* GetMemo2() const { return GetText(OETAG_MEMO2); }
-    unsigned short SetMemo2(const OEString& v) { return SetFromText(OETAG_MEMO2, v); }
+    OE_DATE_ACCESSORS(DateTimePosted, OETAG_DTPOSTED);
+    OE_DATE_ACCESSORS(DateTimeUser, OETAG_DTUSER);
+    OE_DATE_ACCESSORS(DateTimeAvailable, OETAG_DTAVAIL);
+    OE_AMOUNT_ACCESSORS(TxAmount, OETAG_TRNAMT);
+    OE_TEXT_ACCESSORS(FITId, OETAG_FITID);
+    OE_TEXT_ACCESSORS(CorrectedFITId, OETAG_CORRECTFITID);
+    OE_NUMBER_ACCESSORS(CorrectAction, unsigned short, OETAG_CORRECTACTION);
+    OE_TEXT_ACCESSORS(ServerTxId, OETAG_SRVRTID);
+    OE_TEXT_ACCESSORS(ServerTxId2, OETAG_SRVRTID2);
+    OE_TEXT_ACCESSORS(CheckNum, OETAG_CHECKNUM);
+    OE_TEXT_ACCESSORS(ReferenceNum, OETAG_REFNUM);
+    OE_TEXT_ACCESSORS(SIC, OETAG_SIC);
+    OE_TEXT_ACCESSORS(PayeeId, OETAG_PAYEEID);
+    OE_TEXT_ACCESSORS(PayeeId2, OETAG_PAYEEID2);
+    OE_TEXT_ACCESSORS(Name, OETAG_NAME);
+    OE_TEXT_ACCESSORS(Memo, OETAG_MEMO);
+    OE_TEXT_ACCESSORS(Memo2, OETAG_MEMO2);
     // PAYEE and PAYEE2 share one member, as BANKACCTTO and CCACCTTO do, and CURRENCY and
     // ORIGCURRENCY.
     OEPayee* GetPayee() const { return static_cast<OEPayee*>(m_payee.get()); }
-    unsigned short SetPayee(OEPayee* payee) { return SetChildObj(OETAG_PAYEE, payee); }
-    unsigned short SetPayee2(OEPayee2* payee) { return SetChildObj(OETAG_PAYEE2, payee); }
+    OE_SET_CHILD(Payee, OEPayee, OETAG_PAYEE);
+    OE_SET_CHILD(Payee2, OEPayee2, OETAG_PAYEE2);
     OEBankOrCCAccount* GetAccountTo() const { return static_cast<OEBankOrCCAccount*>(m_accountTo.get()); }
     unsigned short SetAccountTo(OEBankOrCCAccount* account);
     OEDataObj* GetCurrency() const { return m_currency.get(); }
@@ -93,12 +67,8 @@ public:
 template <class Base> class OEDateRangeOf : public Base {
 public:
     explicit OEDateRangeOf(unsigned short version = 0) : Base(version) {}
-    const OEDateTime* GetDateStart() const { return this->GetDateTime(OETAG_DTSTART); }
-    unsigned short SetDateStart(const OEString& v) { return this->SetFromText(OETAG_DTSTART, v); }
-    unsigned short SetDateStart(const OEDateTime& v) { return this->SetDateTime(OETAG_DTSTART, v); }
-    const OEDateTime* GetDateEnd() const { return this->GetDateTime(OETAG_DTEND); }
-    unsigned short SetDateEnd(const OEString& v) { return this->SetFromText(OETAG_DTEND, v); }
-    unsigned short SetDateEnd(const OEDateTime& v) { return this->SetDateTime(OETAG_DTEND, v); }
+    OE_DATE_ACCESSORS(DateStart, OETAG_DTSTART);
+    OE_DATE_ACCESSORS(DateEnd, OETAG_DTEND);
 
     OEDateTime m_dtStart, m_dtEnd;
 };
@@ -108,13 +78,9 @@ class OE_API OEBankTransactionList : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEBankTransactionList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendStatementTx(OEBankStatementTx* tx) { return AppendToList(OETAG_STMTTRN, tx); }
+    OE_LIST_ACCESSORS(StatementTx, OEBankStatementTx, OETAG_STMTTRN, m_tx);
     // Replaces the entry at index (index equal to the count appends); the old one is deleted.
     unsigned short SetStatementTx(unsigned short index, OEBankStatementTx* tx);
-    OEBankStatementTx* GetStatementTx(unsigned short index) const {
-        return static_cast<OEBankStatementTx*>(m_tx.Get(index));
-    }
-    unsigned short GetNumStatementTx() const { return m_tx.Entries(); }
     // Forgets every entry without deleting any (the caller keeps them).
     void ClearStatementTx();
     void DeleteAllStatementTx();
@@ -127,9 +93,7 @@ class OE_API OEIncTransaction : public OEDateRangeOf<OEAggregate> {
 public:
     explicit OEIncTransaction(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short GetInclude() const { return static_cast<unsigned short>(GetNumber(OETAG_INCLUDE)); }
-    unsigned short SetInclude(const OEString& v) { return SetFromText(OETAG_INCLUDE, v); }
-    unsigned short SetInclude(unsigned short v) { return SetNumber(OETAG_INCLUDE, v); }
+    OE_NUMBER_ACCESSORS(Include, unsigned short, OETAG_INCLUDE);
 
     unsigned short m_include = 0;
 };
@@ -138,22 +102,11 @@ public:
 class OE_API OEGenericStatementRs : public OETransBase {
 public:
     explicit OEGenericStatementRs(unsigned short version = 0) : OETransBase(version) {}
-    const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
-    unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
-    const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
-    unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OEBankTransactionList* GetTransactionList() const {
-        return static_cast<OEBankTransactionList*>(GetChildObj(OETAG_BANKTRANLIST));
-    }
-    unsigned short SetTransactionList(OEBankTransactionList* l) { return SetChildObj(OETAG_BANKTRANLIST, l); }
-    OELedgerBalance* GetLedgerBalance() const {
-        return static_cast<OELedgerBalance*>(GetChildObj(OETAG_LEDGERBAL));
-    }
-    unsigned short SetLedgerBalance(OELedgerBalance* b) { return SetChildObj(OETAG_LEDGERBAL, b); }
-    OEAvailableBalance* GetAvailableBalance() const {
-        return static_cast<OEAvailableBalance*>(GetChildObj(OETAG_AVAILBAL));
-    }
-    unsigned short SetAvailableBalance(OEAvailableBalance* b) { return SetChildObj(OETAG_AVAILBAL, b); }
+    OE_TEXT_ACCESSORS(CurDef, OETAG_CURDEF);
+    OE_TEXT_ACCESSORS(MktgInfo, OETAG_MKTGINFO);
+    OE_CHILD_ACCESSORS(TransactionList, OEBankTransactionList, OETAG_BANKTRANLIST);
+    OE_CHILD_ACCESSORS(LedgerBalance, OELedgerBalance, OETAG_LEDGERBAL);
+    OE_CHILD_ACCESSORS(AvailableBalance, OEAvailableBalance, OETAG_AVAILBAL);
 
     OEString3 m_curDef;
     OEOwnedChild m_account, m_tranList, m_ledgerBal, m_availBal;
@@ -165,8 +118,7 @@ public:
 template <class Base, class Account, OETagID Tag> class OEAccountFromOf : public Base {
 public:
     explicit OEAccountFromOf(unsigned short version = 0) : Base(version) {}
-    Account* GetAccountFrom() const { return static_cast<Account*>(this->GetChildObj(Tag)); }
-    unsigned short SetAccountFrom(Account* account) { return this->SetChildObj(Tag, account); }
+    OE_CHILD_ACCESSORS(AccountFrom, Account, Tag);
 };
 
 // STMTRS.
@@ -188,10 +140,7 @@ public:
 class OE_API OEGenericStatementRq : public OETransBase {
 public:
     explicit OEGenericStatementRq(unsigned short version = 0) : OETransBase(version) {}
-    OEIncTransaction* GetIncTransaction() const {
-        return static_cast<OEIncTransaction*>(GetChildObj(OETAG_INCTRAN));
-    }
-    unsigned short SetIncTransaction(OEIncTransaction* inc) { return SetChildObj(OETAG_INCTRAN, inc); }
+    OE_CHILD_ACCESSORS(IncTransaction, OEIncTransaction, OETAG_INCTRAN);
     // A repeated account or INCTRAN logs OEPW_EXTRAAGG and replaces the old object; the new one
     // comes from the factory with version 0 (the factory's own).
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;

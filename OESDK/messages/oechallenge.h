@@ -8,10 +8,8 @@
 class OE_API OEChallengeBase : public OETransBase {
 public:
     explicit OEChallengeBase(unsigned short version = 0) : OETransBase(version) {}
-    const OEString* GetUserId() const { return GetText(OETAG_USERID); }
-    unsigned short SetUserId(const OEString& v) { return SetFromText(OETAG_USERID, v); }
-    const OEString* GetFICertId() const { return GetText(OETAG_FICERTID); }
-    unsigned short SetFICertId(const OEString& v) { return SetFromText(OETAG_FICERTID, v); }
+    OE_TEXT_ACCESSORS(UserId, OETAG_USERID);
+    OE_TEXT_ACCESSORS(FICertId, OETAG_FICERTID);
 
     OEString32 m_userId;
     OEBoundedString<64> m_fiCertId;
@@ -29,8 +27,7 @@ class OE_API OEChallengeRs : public OEChallengeBase {
 public:
     explicit OEChallengeRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetNonce() const { return GetText(OETAG_NONCE); }
-    unsigned short SetNonce(const OEString& v) { return SetFromText(OETAG_NONCE, v); }
+    OE_TEXT_ACCESSORS(Nonce, OETAG_NONCE);
 
     OEBoundedString<16> m_nonce;
 };

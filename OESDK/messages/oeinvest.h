@@ -17,10 +17,8 @@ class OE_API OEInvAcctFrom : public OEAggregate {
 public:
     explicit OEInvAcctFrom(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetBrokerId() const { return GetText(OETAG_BROKERID); }
-    unsigned short SetBrokerId(const OEString& v) { return SetFromText(OETAG_BROKERID, v); }
-    const OEString* GetAcctId() const { return GetText(OETAG_ACCTID); }
-    unsigned short SetAcctId(const OEString& v) { return SetFromText(OETAG_ACCTID, v); }
+    OE_TEXT_ACCESSORS(BrokerId, OETAG_BROKERID);
+    OE_TEXT_ACCESSORS(AcctId, OETAG_ACCTID);
 
     OEBoundedString<22> m_brokerId, m_acctId;
 };
@@ -30,11 +28,8 @@ class OE_API OEIncPos : public OEAggregate {
 public:
     explicit OEIncPos(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDateAsOf() const { return GetDateTime(OETAG_DTASOF); }
-    unsigned short SetDateAsOf(const OEString& v) { return SetFromText(OETAG_DTASOF, v); }
-    unsigned short SetDateAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTASOF, v); }
-    unsigned short GetInclude() const { return static_cast<unsigned short>(GetNumber(OETAG_INCLUDE)); }
-    unsigned short SetInclude(unsigned short v) { return SetNumber(OETAG_INCLUDE, v); }
+    OE_DATE_ACCESSORS(DateAsOf, OETAG_DTASOF);
+    OE_NUMBER_VALUE_ACCESSORS(Include, unsigned short, OETAG_INCLUDE);
 
     OEDateTime m_dtAsOf;
     unsigned short m_include = 0;
@@ -45,12 +40,8 @@ class OE_API OEInvStmtRq : public OEAccountFromOf<OETransBase, OEInvAcctFrom, OE
 public:
     explicit OEInvStmtRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEIncTransaction* GetIncTransaction() const {
-        return static_cast<OEIncTransaction*>(GetChildObj(OETAG_INCTRAN));
-    }
-    unsigned short SetIncTransaction(OEIncTransaction* inc) { return SetChildObj(OETAG_INCTRAN, inc); }
-    OEIncPos* GetIncPos() const { return static_cast<OEIncPos*>(GetChildObj(OETAG_INCPOS)); }
-    unsigned short SetIncPos(OEIncPos* inc) { return SetChildObj(OETAG_INCPOS, inc); }
+    OE_CHILD_ACCESSORS(IncTransaction, OEIncTransaction, OETAG_INCTRAN);
+    OE_CHILD_ACCESSORS(IncPos, OEIncPos, OETAG_INCPOS);
     // The Y/N marks by tag: INCOO, INCBAL (0 for any other tag).
     unsigned short GetIncludeFlag(OETagID tag) const { return static_cast<unsigned short>(GetNumber(tag)); }
     unsigned short SetIncludeFlag(OETagID tag, unsigned short v);
@@ -65,24 +56,14 @@ class OE_API OEInvTran : public OEAggregate {
 public:
     explicit OEInvTran(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetFITId() const { return GetText(OETAG_FITID); }
-    unsigned short SetFITId(const OEString& v) { return SetFromText(OETAG_FITID, v); }
-    const OEString* GetServerTxId() const { return GetText(OETAG_SRVRTID); }
-    unsigned short SetServerTxId(const OEString& v) { return SetFromText(OETAG_SRVRTID, v); }
-    const OEString* GetServerTxId2() const { return GetText(OETAG_SRVRTID2); }
-    unsigned short SetServerTxId2(const OEString& v) { return SetFromText(OETAG_SRVRTID2, v); }
-    const OEDateTime* GetDateTrade() const { return GetDateTime(OETAG_DTTRADE); }
-    unsigned short SetDateTrade(const OEString& v) { return SetFromText(OETAG_DTTRADE, v); }
-    unsigned short SetDateTrade(const OEDateTime& v) { return SetDateTime(OETAG_DTTRADE, v); }
-    const OEDateTime* GetDateSettle() const { return GetDateTime(OETAG_DTSETTLE); }
-    unsigned short SetDateSettle(const OEString& v) { return SetFromText(OETAG_DTSETTLE, v); }
-    unsigned short SetDateSettle(const OEDateTime& v) { return SetDateTime(OETAG_DTSETTLE, v); }
-    const OEString* GetReversalFITId() const { return GetText(OETAG_REVERSALFITID); }
-    unsigned short SetReversalFITId(const OEString& v) { return SetFromText(OETAG_REVERSALFITID, v); }
-    const OEString* GetMemo() const { return GetText(OETAG_MEMO); }
-    unsigned short SetMemo(const OEString& v) { return SetFromText(OETAG_MEMO, v); }
-    const OEString* GetMemo2() const { return GetText(OETAG_MEMO2); }
-    unsigned short SetMemo2(const OEString& v) { return SetFromText(OETAG_MEMO2, v); }
+    OE_TEXT_ACCESSORS(FITId, OETAG_FITID);
+    OE_TEXT_ACCESSORS(ServerTxId, OETAG_SRVRTID);
+    OE_TEXT_ACCESSORS(ServerTxId2, OETAG_SRVRTID2);
+    OE_DATE_ACCESSORS(DateTrade, OETAG_DTTRADE);
+    OE_DATE_ACCESSORS(DateSettle, OETAG_DTSETTLE);
+    OE_TEXT_ACCESSORS(ReversalFITId, OETAG_REVERSALFITID);
+    OE_TEXT_ACCESSORS(Memo, OETAG_MEMO);
+    OE_TEXT_ACCESSORS(Memo2, OETAG_MEMO2);
 
     OEString255 m_fitId, m_reversalFitId, m_memo;
     OEBoundedString<10> m_srvrTid;
@@ -97,28 +78,20 @@ public:
 class OE_API OEInvestmentTx : public OEAggregate {
 public:
     explicit OEInvestmentTx(unsigned short version = 0) : OEAggregate(version) {}
-    OEInvTran* GetInvTran() const { return static_cast<OEInvTran*>(GetChildObj(OETAG_INVTRAN)); }
-    unsigned short SetInvTran(OEInvTran* t) { return SetChildObj(OETAG_INVTRAN, t); }
-    OESecID* GetSecID() const { return static_cast<OESecID*>(GetChildObj(OETAG_SECID)); }
-    unsigned short SetSecID(OESecID* id) { return SetChildObj(OETAG_SECID, id); }
+    OE_CHILD_ACCESSORS(InvTran, OEInvTran, OETAG_INVTRAN);
+    OE_CHILD_ACCESSORS(SecID, OESecID, OETAG_SECID);
     // Any amount element by tag (UNITS, UNITPRICE, TOTAL, COMMISSION, FEES, GAIN, ...).
     const OEPrecisionInteger* GetAmountOf(OETagID tag) const { return GetAmount(tag); }
     unsigned short SetAmountOf(OETagID tag, const OEPrecisionInteger& v) { return SetAmount(tag, v); }
-    const OEPrecisionInteger* GetUnits() const { return GetAmount(OETAG_UNITS); }
-    const OEPrecisionInteger* GetUnitPrice() const { return GetAmount(OETAG_UNITPRICE); }
-    const OEPrecisionInteger* GetTotal() const { return GetAmount(OETAG_TOTAL); }
+    OE_GET_AMOUNT(Units, OETAG_UNITS);
+    OE_GET_AMOUNT(UnitPrice, OETAG_UNITPRICE);
+    OE_GET_AMOUNT(Total, OETAG_TOTAL);
     // Any element by tag from its text (enumerations by keyword, Y/N marks, amounts, dates).
     unsigned short SetElement(OETagID tag, const OEString& v) { return SetFromText(tag, v); }
-    OESubAcct GetSubAcctSec() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTSEC)); }
-    OESubAcct GetSubAcctFund() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTFUND)); }
-    unsigned short SetSubAcctSec(OESubAcct v) {
-        return SetNumber(OETAG_SUBACCTSEC, static_cast<unsigned long>(v));
-    }
-    unsigned short SetSubAcctFund(OESubAcct v) {
-        return SetNumber(OETAG_SUBACCTFUND, static_cast<unsigned long>(v));
-    }
-    OEIncomeType GetIncomeType() const { return static_cast<OEIncomeType>(GetNumber(OETAG_INCOMETYPE)); }
-    unsigned short GetTaxExempt() const { return static_cast<unsigned short>(GetNumber(OETAG_TAXEXEMPT)); }
+    OE_NUMBER_VALUE_ACCESSORS(SubAcctSec, OESubAcct, OETAG_SUBACCTSEC);
+    OE_NUMBER_VALUE_ACCESSORS(SubAcctFund, OESubAcct, OETAG_SUBACCTFUND);
+    OE_GET_NUMBER(IncomeType, OEIncomeType, OETAG_INCOMETYPE);
+    OE_GET_NUMBER(TaxExempt, unsigned short, OETAG_TAXEXEMPT);
     OEDataObj* GetCurrency() const { return m_currency.get(); }
     // A CURRENCY or an ORIGCURRENCY (the object's own tag says which); null clears.
     unsigned short SetCurrency(OECurrency* currency);
@@ -133,10 +106,7 @@ class OE_API OEInvBankTran : public OEInvestmentTx {
 public:
     explicit OEInvBankTran(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEBankStatementTx* GetStatementTx() const {
-        return static_cast<OEBankStatementTx*>(GetChildObj(OETAG_STMTTRN));
-    }
-    unsigned short SetStatementTx(OEBankStatementTx* tx) { return SetChildObj(OETAG_STMTTRN, tx); }
+    OE_CHILD_ACCESSORS(StatementTx, OEBankStatementTx, OETAG_STMTTRN);
 
     OEOwnedChild m_stmtTrn;
 };
@@ -166,20 +136,19 @@ public:
 template <class Trade, OETagID TradeTag> class OETradeOf : public OEAggregate {
 public:
     explicit OETradeOf(unsigned short version = 0) : OEAggregate(version) {}
-    Trade* GetTrade() const { return static_cast<Trade*>(GetChildObj(TradeTag)); }
-    unsigned short SetTrade(Trade* t) { return SetChildObj(TradeTag, t); }
+    OE_CHILD_ACCESSORS(Trade, Trade, TradeTag);
     // Any element by tag from its text (BUYTYPE, SELLTYPE, ACCRDINT, RELFITID, SHPERCTRCT, ...).
     unsigned short SetElement(OETagID tag, const OEString& v) { return SetFromText(tag, v); }
     // The value of an enumerated, Y/N or count element by tag (0 when absent).
     unsigned long GetNumberOf(OETagID tag) const { return GetNumber(tag); }
-    const OEPrecisionInteger* GetAccruedInterest() const { return GetAmount(OETAG_ACCRDINT); }
-    const OEPrecisionInteger* GetAvgCostBasis() const { return GetAmount(OETAG_AVGCOSTBASIS); }
-    const OEString* GetRelFITId() const { return GetText(OETAG_RELFITID); }
-    OEBuyType GetBuyType() const { return static_cast<OEBuyType>(GetNumber(OETAG_BUYTYPE)); }
-    OESellType GetSellType() const { return static_cast<OESellType>(GetNumber(OETAG_SELLTYPE)); }
-    OEOptBuyType GetOptBuyType() const { return static_cast<OEOptBuyType>(GetNumber(OETAG_OPTBUYTYPE)); }
-    OEOptSellType GetOptSellType() const { return static_cast<OEOptSellType>(GetNumber(OETAG_OPTSELLTYPE)); }
-    OESellReason GetSellReason() const { return static_cast<OESellReason>(GetNumber(OETAG_SELLREASON)); }
+    OE_GET_AMOUNT(AccruedInterest, OETAG_ACCRDINT);
+    OE_GET_AMOUNT(AvgCostBasis, OETAG_AVGCOSTBASIS);
+    OE_GET_TEXT(RelFITId, OETAG_RELFITID);
+    OE_GET_NUMBER(BuyType, OEBuyType, OETAG_BUYTYPE);
+    OE_GET_NUMBER(SellType, OESellType, OETAG_SELLTYPE);
+    OE_GET_NUMBER(OptBuyType, OEOptBuyType, OETAG_OPTBUYTYPE);
+    OE_GET_NUMBER(OptSellType, OEOptSellType, OETAG_OPTSELLTYPE);
+    OE_GET_NUMBER(SellReason, OESellReason, OETAG_SELLREASON);
 
     OEOwnedChild m_trade;
     unsigned short m_type = 0, m_relType = 0, m_secured = 0; // BUYTYPE / SELLTYPE / OPT... / SELLREASON
@@ -220,22 +189,19 @@ public:
     const OEDateTime* GetDateOf(OETagID tag) const { return GetDateTime(tag); }
     const OEString* GetTextOf(OETagID tag) const { return GetText(tag); }
     // SPLIT
-    const OEPrecisionInteger* GetOldUnits() const { return GetAmount(OETAG_OLDUNITS); }
-    const OEPrecisionInteger* GetNewUnits() const { return GetAmount(OETAG_NEWUNITS); }
-    const OEPrecisionInteger* GetNumerator() const { return GetAmount(OETAG_NUMERATOR); }
-    const OEPrecisionInteger* GetDenominator() const { return GetAmount(OETAG_DENOMINATOR); }
+    OE_GET_AMOUNT(OldUnits, OETAG_OLDUNITS);
+    OE_GET_AMOUNT(NewUnits, OETAG_NEWUNITS);
+    OE_GET_AMOUNT(Numerator, OETAG_NUMERATOR);
+    OE_GET_AMOUNT(Denominator, OETAG_DENOMINATOR);
     // JRNLFUND, JRNLSEC
-    OESubAcct GetSubAcctTo() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTTO)); }
-    OESubAcct GetSubAcctFrom() const { return static_cast<OESubAcct>(GetNumber(OETAG_SUBACCTFROM)); }
+    OE_GET_NUMBER(SubAcctTo, OESubAcct, OETAG_SUBACCTTO);
+    OE_GET_NUMBER(SubAcctFrom, OESubAcct, OETAG_SUBACCTFROM);
     // TRANSFER, CLOSUREOPT
-    OETferAction GetTferAction() const { return static_cast<OETferAction>(GetNumber(OETAG_TFERACTION)); }
-    OEPosType GetPosType() const { return static_cast<OEPosType>(GetNumber(OETAG_POSTYPE)); }
-    OEOptAction GetOptAction() const { return static_cast<OEOptAction>(GetNumber(OETAG_OPTACTION)); }
+    OE_GET_NUMBER(TferAction, OETferAction, OETAG_TFERACTION);
+    OE_GET_NUMBER(PosType, OEPosType, OETAG_POSTYPE);
+    OE_GET_NUMBER(OptAction, OEOptAction, OETAG_OPTACTION);
     // TRANSFER's INVACCTFROM.
-    OEInvAcctFrom* GetInvAcctFrom() const {
-        return static_cast<OEInvAcctFrom*>(GetChildObj(OETAG_INVACCTFROM));
-    }
-    unsigned short SetInvAcctFrom(OEInvAcctFrom* a) { return SetChildObj(OETAG_INVACCTFROM, a); }
+    OE_CHILD_ACCESSORS(InvAcctFrom, OEInvAcctFrom, OETAG_INVACCTFROM);
 
     OEPrecisionInteger m_oldUnits, m_newUnits, m_numerator, m_denominator, m_fracCash, m_avgCostBasis, m_gain;
     unsigned short m_subAcctTo = 0, m_subAcctFrom = 0, m_action = 0, m_posType = 0;
@@ -260,14 +226,9 @@ class OE_API OEInvTranList : public OEDateRangeOf<OEMixedList> {
 public:
     explicit OEInvTranList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    // Appends a transaction of any of the twenty-one kinds (its own tag says which); the list
-    // owns it. 0 for null or another kind (the caller keeps it).
-    unsigned short AppendTransaction(OEAggregate* tx) { return AppendEntry(tx); }
-    OEAggregate* GetTransaction(unsigned short index) const {
-        return static_cast<OEAggregate*>(m_entries.Get(index));
-    }
-    unsigned short GetNumTransaction() const { return m_entries.Entries(); }
-    void DeleteAllTransaction() { DeleteAllEntries(); }
+    // AppendTransaction takes a transaction of any of the twenty-one kinds (its own tag says
+    // which); the list owns it. 0 for null or another kind (the caller keeps it).
+    OE_ENTRY_ACCESSORS(Transaction, OEAggregate);
 };
 
 // BALLIST: BAL entries in order.
@@ -275,9 +236,7 @@ class OE_API OEBalList : public OEAggregate {
 public:
     explicit OEBalList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendBalance(OEBalance* bal) { return AppendToList(OETAG_BAL, bal); }
-    OEBalance* GetBalance(unsigned short index) const { return static_cast<OEBalance*>(m_bal.Get(index)); }
-    unsigned short GetNumBalance() const { return m_bal.Entries(); }
+    OE_LIST_ACCESSORS(Balance, OEBalance, OETAG_BAL, m_bal);
 
     OEDataObjList m_bal;
 };
@@ -287,16 +246,11 @@ class OE_API OEInvBal : public OEAggregate {
 public:
     explicit OEInvBal(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEPrecisionInteger* GetAvailCash() const { return GetAmount(OETAG_AVAILCASH); }
-    unsigned short SetAvailCash(const OEPrecisionInteger& v) { return SetAmount(OETAG_AVAILCASH, v); }
-    const OEPrecisionInteger* GetMarginBalance() const { return GetAmount(OETAG_MARGINBALANCE); }
-    unsigned short SetMarginBalance(const OEPrecisionInteger& v) { return SetAmount(OETAG_MARGINBALANCE, v); }
-    const OEPrecisionInteger* GetShortBalance() const { return GetAmount(OETAG_SHORTBALANCE); }
-    unsigned short SetShortBalance(const OEPrecisionInteger& v) { return SetAmount(OETAG_SHORTBALANCE, v); }
-    const OEPrecisionInteger* GetBuyPower() const { return GetAmount(OETAG_BUYPOWER); }
-    unsigned short SetBuyPower(const OEPrecisionInteger& v) { return SetAmount(OETAG_BUYPOWER, v); }
-    OEBalList* GetBalList() const { return static_cast<OEBalList*>(GetChildObj(OETAG_BALLIST)); }
-    unsigned short SetBalList(OEBalList* l) { return SetChildObj(OETAG_BALLIST, l); }
+    OE_AMOUNT_VALUE_ACCESSORS(AvailCash, OETAG_AVAILCASH);
+    OE_AMOUNT_VALUE_ACCESSORS(MarginBalance, OETAG_MARGINBALANCE);
+    OE_AMOUNT_VALUE_ACCESSORS(ShortBalance, OETAG_SHORTBALANCE);
+    OE_AMOUNT_VALUE_ACCESSORS(BuyPower, OETAG_BUYPOWER);
+    OE_CHILD_ACCESSORS(BalList, OEBalList, OETAG_BALLIST);
 
     OEPrecisionInteger m_availCash, m_marginBalance, m_shortBalance, m_buyPower;
     OEOwnedChild m_balList;
@@ -308,19 +262,17 @@ class OE_API OEInvPos : public OEAggregate {
 public:
     explicit OEInvPos(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OESecID* GetSecID() const { return static_cast<OESecID*>(GetChildObj(OETAG_SECID)); }
-    unsigned short SetSecID(OESecID* id) { return SetChildObj(OETAG_SECID, id); }
-    OESubAcct GetHeldInAcct() const { return static_cast<OESubAcct>(GetNumber(OETAG_HELDINACCT)); }
-    OEPosType GetPosType() const { return static_cast<OEPosType>(GetNumber(OETAG_POSTYPE)); }
-    const OEPrecisionInteger* GetUnits() const { return GetAmount(OETAG_UNITS); }
-    const OEPrecisionInteger* GetUnitPrice() const { return GetAmount(OETAG_UNITPRICE); }
-    const OEPrecisionInteger* GetMarketValue() const { return GetAmount(OETAG_MKTVAL); }
-    const OEPrecisionInteger* GetAvgCostBasis() const { return GetAmount(OETAG_AVGCOSTBASIS); }
-    const OEDateTime* GetDatePriceAsOf() const { return GetDateTime(OETAG_DTPRICEASOF); }
-    const OEString* GetMemo() const { return GetText(OETAG_MEMO); }
-    const OEString* GetMemo2() const { return GetText(OETAG_MEMO2); }
-    OECurrency* GetCurrency() const { return static_cast<OECurrency*>(GetChildObj(OETAG_CURRENCY)); }
-    unsigned short SetCurrency(OECurrency* c) { return SetChildObj(OETAG_CURRENCY, c); }
+    OE_CHILD_ACCESSORS(SecID, OESecID, OETAG_SECID);
+    OE_GET_NUMBER(HeldInAcct, OESubAcct, OETAG_HELDINACCT);
+    OE_GET_NUMBER(PosType, OEPosType, OETAG_POSTYPE);
+    OE_GET_AMOUNT(Units, OETAG_UNITS);
+    OE_GET_AMOUNT(UnitPrice, OETAG_UNITPRICE);
+    OE_GET_AMOUNT(MarketValue, OETAG_MKTVAL);
+    OE_GET_AMOUNT(AvgCostBasis, OETAG_AVGCOSTBASIS);
+    OE_GET_DATE(DatePriceAsOf, OETAG_DTPRICEASOF);
+    OE_GET_TEXT(Memo, OETAG_MEMO);
+    OE_GET_TEXT(Memo2, OETAG_MEMO2);
+    OE_CHILD_ACCESSORS(Currency, OECurrency, OETAG_CURRENCY);
     // Any element by tag from its text.
     unsigned short SetElement(OETagID tag, const OEString& v) { return SetFromText(tag, v); }
 
@@ -337,13 +289,12 @@ public:
 class OE_API OEPosition : public OEAggregate {
 public:
     explicit OEPosition(unsigned short version = 0) : OEAggregate(version) {}
-    OEInvPos* GetInvPos() const { return static_cast<OEInvPos*>(GetChildObj(OETAG_INVPOS)); }
-    unsigned short SetInvPos(OEInvPos* p) { return SetChildObj(OETAG_INVPOS, p); }
-    const OEPrecisionInteger* GetUnitsStreet() const { return GetAmount(OETAG_UNITSSTREET); }
-    const OEPrecisionInteger* GetUnitsUser() const { return GetAmount(OETAG_UNITSUSER); }
-    unsigned short GetReinvDiv() const { return static_cast<unsigned short>(GetNumber(OETAG_REINVDIV)); }
-    unsigned short GetReinvCG() const { return static_cast<unsigned short>(GetNumber(OETAG_REINVCG)); }
-    OESecured GetSecured() const { return static_cast<OESecured>(GetNumber(OETAG_SECURED)); }
+    OE_CHILD_ACCESSORS(InvPos, OEInvPos, OETAG_INVPOS);
+    OE_GET_AMOUNT(UnitsStreet, OETAG_UNITSSTREET);
+    OE_GET_AMOUNT(UnitsUser, OETAG_UNITSUSER);
+    OE_GET_NUMBER(ReinvDiv, unsigned short, OETAG_REINVDIV);
+    OE_GET_NUMBER(ReinvCG, unsigned short, OETAG_REINVCG);
+    OE_GET_NUMBER(Secured, OESecured, OETAG_SECURED);
     unsigned short SetElement(OETagID tag, const OEString& v) { return SetFromText(tag, v); }
 
     OEOwnedChild m_invPos;
@@ -362,12 +313,7 @@ class OE_API OEInvPosList : public OEMixedList {
 public:
     explicit OEInvPosList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendPosition(OEPosition* pos) { return AppendEntry(pos); }
-    OEPosition* GetPosition(unsigned short index) const {
-        return static_cast<OEPosition*>(m_entries.Get(index));
-    }
-    unsigned short GetNumPosition() const { return m_entries.Entries(); }
-    void DeleteAllPosition() { DeleteAllEntries(); }
+    OE_ENTRY_ACCESSORS(Position, OEPosition);
 };
 
 // INVSTMTRS: DTASOF, CURDEF, the account, the transaction and position lists, the balances, the
@@ -376,21 +322,13 @@ class OE_API OEInvStmtRs : public OEAccountFromOf<OETransBase, OEInvAcctFrom, OE
 public:
     explicit OEInvStmtRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDateAsOf() const { return GetDateTime(OETAG_DTASOF); }
-    unsigned short SetDateAsOf(const OEString& v) { return SetFromText(OETAG_DTASOF, v); }
-    unsigned short SetDateAsOf(const OEDateTime& v) { return SetDateTime(OETAG_DTASOF, v); }
-    const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
-    unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
-    const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
-    unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
-    OEInvTranList* GetTranList() const { return static_cast<OEInvTranList*>(GetChildObj(OETAG_INVTRANLIST)); }
-    unsigned short SetTranList(OEInvTranList* l) { return SetChildObj(OETAG_INVTRANLIST, l); }
-    OEInvPosList* GetPosList() const { return static_cast<OEInvPosList*>(GetChildObj(OETAG_INVPOSLIST)); }
-    unsigned short SetPosList(OEInvPosList* l) { return SetChildObj(OETAG_INVPOSLIST, l); }
-    OEInvBal* GetInvBal() const { return static_cast<OEInvBal*>(GetChildObj(OETAG_INVBAL)); }
-    unsigned short SetInvBal(OEInvBal* b) { return SetChildObj(OETAG_INVBAL, b); }
-    OEInvOOList* GetOOList() const { return static_cast<OEInvOOList*>(GetChildObj(OETAG_INVOOLIST)); }
-    unsigned short SetOOList(OEInvOOList* l) { return SetChildObj(OETAG_INVOOLIST, l); }
+    OE_DATE_ACCESSORS(DateAsOf, OETAG_DTASOF);
+    OE_TEXT_ACCESSORS(CurDef, OETAG_CURDEF);
+    OE_TEXT_ACCESSORS(MktgInfo, OETAG_MKTGINFO);
+    OE_CHILD_ACCESSORS(TranList, OEInvTranList, OETAG_INVTRANLIST);
+    OE_CHILD_ACCESSORS(PosList, OEInvPosList, OETAG_INVPOSLIST);
+    OE_CHILD_ACCESSORS(InvBal, OEInvBal, OETAG_INVBAL);
+    OE_CHILD_ACCESSORS(OOList, OEInvOOList, OETAG_INVOOLIST);
 
     OEDateTime m_dtAsOf;
     OEString3 m_curDef;

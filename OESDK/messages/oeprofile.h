@@ -15,40 +15,18 @@ public:
     long GetVer() const { return GetSigned(OETAG_VER); }
     unsigned short SetVer(const OEString& v) { return SetFromText(OETAG_VER, v); }
     unsigned short SetVer(long v) { return SetSigned(OETAG_VER, v); }
-    const OEString* GetURL() const { return GetText(OETAG_URL); }
-    unsigned short SetURL(const OEString& v) { return SetFromText(OETAG_URL, v); }
-    const OEString* GetURL2() const { return GetText(OETAG_URL2); }
-    unsigned short SetURL2(const OEString& v) { return SetFromText(OETAG_URL2, v); }
-    unsigned short GetOFXSecurity() const { return static_cast<unsigned short>(GetNumber(OETAG_OFXSEC)); }
-    unsigned short SetOFXSecurity(const OEString& v) { return SetFromText(OETAG_OFXSEC, v); }
-    unsigned short SetOFXSecurity(unsigned short v) { return SetNumber(OETAG_OFXSEC, v); }
-    unsigned short GetTransportSecurity() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_TRANSPSEC));
-    }
-    unsigned short SetTransportSecurity(const OEString& v) { return SetFromText(OETAG_TRANSPSEC, v); }
-    unsigned short SetTransportSecurity(unsigned short v) { return SetNumber(OETAG_TRANSPSEC, v); }
-    const OEString* GetSignOnRealm() const { return GetText(OETAG_SIGNONREALM); }
-    unsigned short SetSignOnRealm(const OEString& v) { return SetFromText(OETAG_SIGNONREALM, v); }
-    unsigned short GetSyncMode() const { return static_cast<unsigned short>(GetNumber(OETAG_SYNCMODE)); }
-    unsigned short SetSyncMode(const OEString& v) { return SetFromText(OETAG_SYNCMODE, v); }
-    unsigned short SetSyncMode(unsigned short v) { return SetNumber(OETAG_SYNCMODE, v); }
-    unsigned short GetRespFileer() const { return static_cast<unsigned short>(GetNumber(OETAG_RESPFILEER)); }
-    unsigned short SetRespFileer(const OEString& v) { return SetFromText(OETAG_RESPFILEER, v); }
-    unsigned short SetRespFileer(unsigned short v) { return SetNumber(OETAG_RESPFILEER, v); }
-    const OEString* GetServiceProviderName() const { return GetText(OETAG_SPNAME); }
-    unsigned short SetServiceProviderName(const OEString& v) { return SetFromText(OETAG_SPNAME, v); }
-    unsigned long GetKestTimeout() const { return GetNumber(OETAG_KEST_TIMEOUT); }
-    unsigned short SetKestTimeout(const OEString& v) { return SetFromText(OETAG_KEST_TIMEOUT, v); }
-    unsigned short SetKestTimeout(unsigned long v) { return SetNumber(OETAG_KEST_TIMEOUT, v); }
+    OE_TEXT_ACCESSORS(URL, OETAG_URL);
+    OE_TEXT_ACCESSORS(URL2, OETAG_URL2);
+    OE_NUMBER_ACCESSORS(OFXSecurity, unsigned short, OETAG_OFXSEC);
+    OE_NUMBER_ACCESSORS(TransportSecurity, unsigned short, OETAG_TRANSPSEC);
+    OE_TEXT_ACCESSORS(SignOnRealm, OETAG_SIGNONREALM);
+    OE_NUMBER_ACCESSORS(SyncMode, unsigned short, OETAG_SYNCMODE);
+    OE_NUMBER_ACCESSORS(RespFileer, unsigned short, OETAG_RESPFILEER);
+    OE_TEXT_ACCESSORS(ServiceProviderName, OETAG_SPNAME);
+    OE_NUMBER_ACCESSORS(KestTimeout, unsigned long, OETAG_KEST_TIMEOUT);
     // The repeated elements.
-    unsigned short AppendLanguage(const OEString& v) { return AppendText(OETAG_LANGUAGE, v); }
-    const OEString* GetLanguage(unsigned short i) const { return m_language.GetString(i); }
-    unsigned short GetNumLanguage() const { return m_language.Entries(); }
-    void DeleteAllLanguage() { m_language.DeleteAll(); }
-    unsigned short AppendCountry(const OEString& v) { return AppendText(OETAG_COUNTRY, v); }
-    const OEString* GetCountry(unsigned short i) const { return m_country.GetString(i); }
-    unsigned short GetNumCountry() const { return m_country.Entries(); }
-    void DeleteAllCountry() { m_country.DeleteAll(); }
+    OE_TEXTLIST_ACCESSORS(Language, OETAG_LANGUAGE, m_language);
+    OE_TEXTLIST_ACCESSORS(Country, OETAG_COUNTRY, m_country);
     unsigned short AppendKestMSSCertID(const OEString& v) { return AppendText(OETAG_KEST_MSSCERTID, v); }
     unsigned short GetNumKestMSSCertID() const { return m_mssCertId.Entries(); }
     unsigned short AppendKestType1CertID(const OEString& v) { return AppendText(OETAG_KEST_TYPE1CERTID, v); }
@@ -67,10 +45,7 @@ class OE_API OEMessageSetVersion : public OEAggregate {
 public:
     explicit OEMessageSetVersion(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEMessageSetCore* GetMessageSetCore() const {
-        return static_cast<OEMessageSetCore*>(GetChildObj(OETAG_MSGSETCORE));
-    }
-    unsigned short SetMessageSetCore(OEMessageSetCore* core) { return SetChildObj(OETAG_MSGSETCORE, core); }
+    OE_CHILD_ACCESSORS(MessageSetCore, OEMessageSetCore, OETAG_MSGSETCORE);
 
     OEOwnedChild m_core;
 };
@@ -112,44 +87,19 @@ class OE_API OESignOnInfo : public OEAggregate {
 public:
     explicit OESignOnInfo(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetSignOnRealm() const { return GetText(OETAG_SIGNONREALM); }
-    unsigned short SetSignOnRealm(const OEString& v) { return SetFromText(OETAG_SIGNONREALM, v); }
-    unsigned short GetMin() const { return static_cast<unsigned short>(GetNumber(OETAG_MIN)); }
-    unsigned short SetMin(const OEString& v) { return SetFromText(OETAG_MIN, v); }
-    unsigned short SetMin(unsigned short v) { return SetNumber(OETAG_MIN, v); }
-    unsigned short GetMax() const { return static_cast<unsigned short>(GetNumber(OETAG_MAX)); }
-    unsigned short SetMax(const OEString& v) { return SetFromText(OETAG_MAX, v); }
-    unsigned short SetMax(unsigned short v) { return SetNumber(OETAG_MAX, v); }
+    OE_TEXT_ACCESSORS(SignOnRealm, OETAG_SIGNONREALM);
+    OE_NUMBER_ACCESSORS(Min, unsigned short, OETAG_MIN);
+    OE_NUMBER_ACCESSORS(Max, unsigned short, OETAG_MAX);
     // CHARTYPE as an index of OEKW_CHARTYPE (the order of OECharacterType).
-    unsigned short GetCharType() const { return static_cast<unsigned short>(GetNumber(OETAG_CHARTYPE)); }
-    unsigned short SetCharType(const OEString& v) { return SetFromText(OETAG_CHARTYPE, v); }
-    unsigned short SetCharType(unsigned short v) { return SetNumber(OETAG_CHARTYPE, v); }
-    unsigned short GetCaseSensitive() const { return static_cast<unsigned short>(GetNumber(OETAG_CASESEN)); }
-    unsigned short SetCaseSensitive(const OEString& v) { return SetFromText(OETAG_CASESEN, v); }
-    unsigned short SetCaseSensitive(unsigned short v) { return SetNumber(OETAG_CASESEN, v); }
-    unsigned short GetSpecial() const { return static_cast<unsigned short>(GetNumber(OETAG_SPECIAL)); }
-    unsigned short SetSpecial(const OEString& v) { return SetFromText(OETAG_SPECIAL, v); }
-    unsigned short SetSpecial(unsigned short v) { return SetNumber(OETAG_SPECIAL, v); }
-    unsigned short GetSpaces() const { return static_cast<unsigned short>(GetNumber(OETAG_SPACES)); }
-    unsigned short SetSpaces(const OEString& v) { return SetFromText(OETAG_SPACES, v); }
-    unsigned short SetSpaces(unsigned short v) { return SetNumber(OETAG_SPACES, v); }
-    unsigned short GetPinChange() const { return static_cast<unsigned short>(GetNumber(OETAG_PINCH)); }
-    unsigned short SetPinChange(const OEString& v) { return SetFromText(OETAG_PINCH, v); }
-    unsigned short SetPinChange(unsigned short v) { return SetNumber(OETAG_PINCH, v); }
-    unsigned short GetChangePinFirst() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_CHGPINFIRST));
-    }
-    unsigned short SetChangePinFirst(const OEString& v) { return SetFromText(OETAG_CHGPINFIRST, v); }
-    unsigned short SetChangePinFirst(unsigned short v) { return SetNumber(OETAG_CHGPINFIRST, v); }
+    OE_NUMBER_ACCESSORS(CharType, unsigned short, OETAG_CHARTYPE);
+    OE_NUMBER_ACCESSORS(CaseSensitive, unsigned short, OETAG_CASESEN);
+    OE_NUMBER_ACCESSORS(Special, unsigned short, OETAG_SPECIAL);
+    OE_NUMBER_ACCESSORS(Spaces, unsigned short, OETAG_SPACES);
+    OE_NUMBER_ACCESSORS(PinChange, unsigned short, OETAG_PINCH);
+    OE_NUMBER_ACCESSORS(ChangePinFirst, unsigned short, OETAG_CHGPINFIRST);
     // PWTYPE (every version but 1) as an index of OEKW_PWTYPE.
-    unsigned short GetPasswordType() const { return static_cast<unsigned short>(GetNumber(OETAG_PWTYPE)); }
-    unsigned short SetPasswordType(const OEString& v) { return SetFromText(OETAG_PWTYPE, v); }
-    unsigned short SetPasswordType(unsigned short v) { return SetNumber(OETAG_PWTYPE, v); }
-    unsigned short GetClientUIdRequired() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_CLIENTUIDREQ));
-    }
-    unsigned short SetClientUIdRequired(const OEString& v) { return SetFromText(OETAG_CLIENTUIDREQ, v); }
-    unsigned short SetClientUIdRequired(unsigned short v) { return SetNumber(OETAG_CLIENTUIDREQ, v); }
+    OE_NUMBER_ACCESSORS(PasswordType, unsigned short, OETAG_PWTYPE);
+    OE_NUMBER_ACCESSORS(ClientUIdRequired, unsigned short, OETAG_CLIENTUIDREQ);
 
     OEString32 m_signOnRealm;
     unsigned short m_min = 0, m_max = 0, m_charType = 0, m_caseSen = 0, m_special = 0, m_spaces = 0;
@@ -161,11 +111,7 @@ class OE_API OESignOnInfoList : public OEAggregate {
 public:
     explicit OESignOnInfoList(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendSignOnInfo(OESignOnInfo* info) { return AppendToList(OETAG_SIGNONINFO, info); }
-    OESignOnInfo* GetSignOnInfo(unsigned short index) const {
-        return static_cast<OESignOnInfo*>(m_infos.Get(index));
-    }
-    unsigned short GetNumSignOnInfo() const { return m_infos.Entries(); }
+    OE_LIST_ACCESSORS(SignOnInfo, OESignOnInfo, OETAG_SIGNONINFO, m_infos);
     void DeleteAllSignOnInfo() {
         m_infos.DeleteAll();
         ClearTag(OETAG_SIGNONINFO);
@@ -180,14 +126,8 @@ public:
     explicit OEProfileRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
     // CLIENTROUTING as an index of OEKW_CLIENTROUTING (the order of OEClientRouting).
-    unsigned short GetClientRouting() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_CLIENTROUTING));
-    }
-    unsigned short SetClientRouting(const OEString& v) { return SetFromText(OETAG_CLIENTROUTING, v); }
-    unsigned short SetClientRouting(unsigned short v) { return SetNumber(OETAG_CLIENTROUTING, v); }
-    const OEDateTime* GetDtProfUp() const { return GetDateTime(OETAG_DTPROFUP); }
-    unsigned short SetDtProfUp(const OEString& v) { return SetFromText(OETAG_DTPROFUP, v); }
-    unsigned short SetDtProfUp(const OEDateTime& v) { return SetDateTime(OETAG_DTPROFUP, v); }
+    OE_NUMBER_ACCESSORS(ClientRouting, unsigned short, OETAG_CLIENTROUTING);
+    OE_DATE_ACCESSORS(DtProfUp, OETAG_DTPROFUP);
 
     unsigned short m_clientRouting = 0;
     OEDateTime m_dtProfUp;
@@ -200,51 +140,25 @@ public:
     const OEAggregateDesc& Describe() const override;
     // The required rows, and ADDR3 only together with ADDR2.
     unsigned short AllRequiredPresent() override;
-    OEMessageSetList* GetMessageSetList() const {
-        return static_cast<OEMessageSetList*>(GetChildObj(OETAG_MSGSETLIST));
-    }
-    unsigned short SetMessageSetList(OEMessageSetList* l) { return SetChildObj(OETAG_MSGSETLIST, l); }
-    OESignOnInfoList* GetSignOnInfoList() const {
-        return static_cast<OESignOnInfoList*>(GetChildObj(OETAG_SIGNONINFOLIST));
-    }
-    unsigned short SetSignOnInfoList(OESignOnInfoList* l) { return SetChildObj(OETAG_SIGNONINFOLIST, l); }
-    const OEDateTime* GetDtProfUp() const { return GetDateTime(OETAG_DTPROFUP); }
-    unsigned short SetDtProfUp(const OEString& v) { return SetFromText(OETAG_DTPROFUP, v); }
-    unsigned short SetDtProfUp(const OEDateTime& v) { return SetDateTime(OETAG_DTPROFUP, v); }
-    const OEString* GetFIName() const { return GetText(OETAG_FINAME); }
-    unsigned short SetFIName(const OEString& v) { return SetFromText(OETAG_FINAME, v); }
-    const OEString* GetAddr1() const { return GetText(OETAG_ADDR1); }
-    unsigned short SetAddr1(const OEString& v) { return SetFromText(OETAG_ADDR1, v); }
-    const OEString* GetAddr2() const { return GetText(OETAG_ADDR2); }
-    unsigned short SetAddr2(const OEString& v) { return SetFromText(OETAG_ADDR2, v); }
-    const OEString* GetAddr3() const { return GetText(OETAG_ADDR3); }
-    unsigned short SetAddr3(const OEString& v) { return SetFromText(OETAG_ADDR3, v); }
-    const OEString* GetCity() const { return GetText(OETAG_CITY); }
-    unsigned short SetCity(const OEString& v) { return SetFromText(OETAG_CITY, v); }
-    const OEString* GetState() const { return GetText(OETAG_STATE); }
-    unsigned short SetState(const OEString& v) { return SetFromText(OETAG_STATE, v); }
-    const OEString* GetPostalCode() const { return GetText(OETAG_POSTALCODE); }
-    unsigned short SetPostalCode(const OEString& v) { return SetFromText(OETAG_POSTALCODE, v); }
-    const OEString* GetCountry() const { return GetText(OETAG_COUNTRY); }
-    unsigned short SetCountry(const OEString& v) { return SetFromText(OETAG_COUNTRY, v); }
-    const OEString* GetCustomerServicePhone() const { return GetText(OETAG_CSPHONE); }
-    unsigned short SetCustomerServicePhone(const OEString& v) { return SetFromText(OETAG_CSPHONE, v); }
-    const OEString* GetTechnicalSupportPhone() const { return GetText(OETAG_TSPHONE); }
-    unsigned short SetTechnicalSupportPhone(const OEString& v) { return SetFromText(OETAG_TSPHONE, v); }
-    const OEString* GetFaxPhone() const { return GetText(OETAG_FAXPHONE); }
-    unsigned short SetFaxPhone(const OEString& v) { return SetFromText(OETAG_FAXPHONE, v); }
+    OE_CHILD_ACCESSORS(MessageSetList, OEMessageSetList, OETAG_MSGSETLIST);
+    OE_CHILD_ACCESSORS(SignOnInfoList, OESignOnInfoList, OETAG_SIGNONINFOLIST);
+    OE_DATE_ACCESSORS(DtProfUp, OETAG_DTPROFUP);
+    OE_TEXT_ACCESSORS(FIName, OETAG_FINAME);
+    OE_TEXT_ACCESSORS(Addr1, OETAG_ADDR1);
+    OE_TEXT_ACCESSORS(Addr2, OETAG_ADDR2);
+    OE_TEXT_ACCESSORS(Addr3, OETAG_ADDR3);
+    OE_TEXT_ACCESSORS(City, OETAG_CITY);
+    OE_TEXT_ACCESSORS(State, OETAG_STATE);
+    OE_TEXT_ACCESSORS(PostalCode, OETAG_POSTALCODE);
+    OE_TEXT_ACCESSORS(Country, OETAG_COUNTRY);
+    OE_TEXT_ACCESSORS(CustomerServicePhone, OETAG_CSPHONE);
+    OE_TEXT_ACCESSORS(TechnicalSupportPhone, OETAG_TSPHONE);
+    OE_TEXT_ACCESSORS(FaxPhone, OETAG_FAXPHONE);
     // URL in version 1, URL2 and URLGETREDIRECT in the later versions.
-    const OEString* GetURL() const { return GetText(OETAG_URL); }
-    unsigned short SetURL(const OEString& v) { return SetFromText(OETAG_URL, v); }
-    const OEString* GetURL2() const { return GetText(OETAG_URL2); }
-    unsigned short SetURL2(const OEString& v) { return SetFromText(OETAG_URL2, v); }
-    unsigned short GetURLGetRedirect() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_URLGETREDIRECT));
-    }
-    unsigned short SetURLGetRedirect(const OEString& v) { return SetFromText(OETAG_URLGETREDIRECT, v); }
-    unsigned short SetURLGetRedirect(unsigned short v) { return SetNumber(OETAG_URLGETREDIRECT, v); }
-    const OEString* GetEMail() const { return GetText(OETAG_EMAIL); }
-    unsigned short SetEMail(const OEString& v) { return SetFromText(OETAG_EMAIL, v); }
+    OE_TEXT_ACCESSORS(URL, OETAG_URL);
+    OE_TEXT_ACCESSORS(URL2, OETAG_URL2);
+    OE_NUMBER_ACCESSORS(URLGetRedirect, unsigned short, OETAG_URLGETREDIRECT);
+    OE_TEXT_ACCESSORS(EMail, OETAG_EMAIL);
 
     OEOwnedChild m_msgSetList, m_signOnInfoList;
     OEDateTime m_dtProfUp;

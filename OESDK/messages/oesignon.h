@@ -20,10 +20,8 @@ class OE_API OEFI : public OEAggregate {
 public:
     explicit OEFI(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetOrg() const { return GetText(OETAG_ORG); }
-    unsigned short SetOrg(const OEString& v) { return SetFromText(OETAG_ORG, v); }
-    const OEString* GetFId() const { return GetText(OETAG_FID); }
-    unsigned short SetFId(const OEString& v) { return SetFromText(OETAG_FID, v); }
+    OE_TEXT_ACCESSORS(Org, OETAG_ORG);
+    OE_TEXT_ACCESSORS(FId, OETAG_FID);
 
     OEString32 m_org, m_fid;
 };
@@ -38,34 +36,20 @@ public:
     OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
     using OEAggregate::HandleTagElement;
 
-    const OEString* GetAppId() const { return GetText(OETAG_APPID); }
-    unsigned short SetAppId(const OEString& v) { return SetFromText(OETAG_APPID, v); }
-    unsigned short GetAppVer() const { return static_cast<unsigned short>(GetNumber(OETAG_APPVER)); }
-    unsigned short SetAppVer(const OEString& v) { return SetFromText(OETAG_APPVER, v); }
-    unsigned short SetAppVer(unsigned short v) { return SetNumber(OETAG_APPVER, v); }
-    const OEString* GetClientUId() const { return GetText(OETAG_CLIENTUID); }
-    unsigned short SetClientUId(const OEString& v) { return SetFromText(OETAG_CLIENTUID, v); }
-    const OEString* GetCountry() const { return GetText(OETAG_COUNTRY); }
-    unsigned short SetCountry(const OEString& v) { return SetFromText(OETAG_COUNTRY, v); }
-    const OEDateTime* GetDtClient() const { return GetDateTime(OETAG_DTCLIENT); }
-    unsigned short SetDtClient(const OEString& v) { return SetFromText(OETAG_DTCLIENT, v); }
-    unsigned short SetDtClient(const OEDateTime& v) { return SetDateTime(OETAG_DTCLIENT, v); }
-    OEFI* GetFI() const { return static_cast<OEFI*>(GetChildObj(OETAG_FI)); }
-    unsigned short SetFI(OEFI* fi) { return SetChildObj(OETAG_FI, fi); }
-    unsigned short GetGenUserKey() const { return static_cast<unsigned short>(GetNumber(OETAG_GENUSERKEY)); }
-    unsigned short SetGenUserKey(const OEString& v) { return SetFromText(OETAG_GENUSERKEY, v); }
-    unsigned short SetGenUserKey(unsigned short v) { return SetNumber(OETAG_GENUSERKEY, v); }
-    const OEString* GetLanguage() const { return GetText(OETAG_LANGUAGE); }
-    unsigned short SetLanguage(const OEString& v) { return SetFromText(OETAG_LANGUAGE, v); }
-    const OEString* GetSessCookie() const { return GetText(OETAG_SESSCOOKIE); }
-    unsigned short SetSessCookie(const OEString& v) { return SetFromText(OETAG_SESSCOOKIE, v); }
-    const OEString* GetUserId() const { return GetText(OETAG_USERID); }
-    unsigned short SetUserId(const OEString& v) { return SetFromText(OETAG_USERID, v); }
-    const OEString* GetUserKey() const { return GetText(OETAG_USERKEY); }
-    unsigned short SetUserKey(const OEString& v) { return SetFromText(OETAG_USERKEY, v); }
+    OE_TEXT_ACCESSORS(AppId, OETAG_APPID);
+    OE_NUMBER_ACCESSORS(AppVer, unsigned short, OETAG_APPVER);
+    OE_TEXT_ACCESSORS(ClientUId, OETAG_CLIENTUID);
+    OE_TEXT_ACCESSORS(Country, OETAG_COUNTRY);
+    OE_DATE_ACCESSORS(DtClient, OETAG_DTCLIENT);
+    OE_CHILD_ACCESSORS(FI, OEFI, OETAG_FI);
+    OE_NUMBER_ACCESSORS(GenUserKey, unsigned short, OETAG_GENUSERKEY);
+    OE_TEXT_ACCESSORS(Language, OETAG_LANGUAGE);
+    OE_TEXT_ACCESSORS(SessCookie, OETAG_SESSCOOKIE);
+    OE_TEXT_ACCESSORS(UserId, OETAG_USERID);
+    OE_TEXT_ACCESSORS(UserKey, OETAG_USERKEY);
     // Write-only: there is no getter for the password; Build writes it.
-    unsigned short SetUserPass(const OEString& v) { return SetFromText(OETAG_USERPASS, v); }
-    unsigned short SetOneTimePass(const OEString& v) { return SetFromText(OETAG_ONETIMEPASS, v); }
+    OE_SET_FROM_TEXT(UserPass, OETAG_USERPASS);
+    OE_SET_FROM_TEXT(OneTimePass, OETAG_ONETIMEPASS);
 
     OEOwnedChild m_fi;
     OEDateTime m_dtClient;
@@ -86,33 +70,20 @@ class OE_API OESignOnRs : public OEAggregate {
 public:
     explicit OESignOnRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    OEStatus* GetStatus() const { return static_cast<OEStatus*>(GetChildObj(OETAG_STATUS)); }
-    unsigned short SetStatus(OEStatus* s) { return SetChildObj(OETAG_STATUS, s); }
-    OEFI* GetFI() const { return static_cast<OEFI*>(GetChildObj(OETAG_FI)); }
-    unsigned short SetFI(OEFI* fi) { return SetChildObj(OETAG_FI, fi); }
-    const OEDateTime* GetDtServer() const { return GetDateTime(OETAG_DTSERVER); }
-    unsigned short SetDtServer(const OEString& v) { return SetFromText(OETAG_DTSERVER, v); }
-    unsigned short SetDtServer(const OEDateTime& v) { return SetDateTime(OETAG_DTSERVER, v); }
-    const OEDateTime* GetDtProfUp() const { return GetDateTime(OETAG_DTPROFUP); }
-    unsigned short SetDtProfUp(const OEString& v) { return SetFromText(OETAG_DTPROFUP, v); }
-    const OEDateTime* GetDtAcctUp() const { return GetDateTime(OETAG_DTACCTUP); }
-    unsigned short SetDtAcctUp(const OEString& v) { return SetFromText(OETAG_DTACCTUP, v); }
-    const OEDateTime* GetTsKeyExpire() const { return GetDateTime(OETAG_TSKEYEXPIRE); }
-    unsigned short SetTsKeyExpire(const OEString& v) { return SetFromText(OETAG_TSKEYEXPIRE, v); }
-    const OEString* GetLanguage() const { return GetText(OETAG_LANGUAGE); }
-    unsigned short SetLanguage(const OEString& v) { return SetFromText(OETAG_LANGUAGE, v); }
-    const OEString* GetCountry() const { return GetText(OETAG_COUNTRY); }
-    unsigned short SetCountry(const OEString& v) { return SetFromText(OETAG_COUNTRY, v); }
-    const OEString* GetUserKey() const { return GetText(OETAG_USERKEY); }
-    unsigned short SetUserKey(const OEString& v) { return SetFromText(OETAG_USERKEY, v); }
-    unsigned short SetSessCookie(const OEString& v) { return SetFromText(OETAG_SESSCOOKIE, v); }
-    unsigned long GetKestBid() const { return GetNumber(OETAG_KEST_BID); }
-    unsigned short SetKestBid(unsigned long v) { return SetNumber(OETAG_KEST_BID, v); }
-    unsigned long GetKestPid() const { return GetNumber(OETAG_KEST_PRESENCEID); }
-    unsigned short SetKestPid(unsigned long v) { return SetNumber(OETAG_KEST_PRESENCEID, v); }
-    const OEString* GetKestUserId() const { return GetText(OETAG_KEST_USERID); }
-    unsigned short SetKestUserId(const OEString& v) { return SetFromText(OETAG_KEST_USERID, v); }
-    unsigned short SetKestMktCookie(const OEString& v) { return SetFromText(OETAG_KEST_MKTCOOKIE, v); }
+    OE_CHILD_ACCESSORS(Status, OEStatus, OETAG_STATUS);
+    OE_CHILD_ACCESSORS(FI, OEFI, OETAG_FI);
+    OE_DATE_ACCESSORS(DtServer, OETAG_DTSERVER);
+    OE_DATE_TEXT_ACCESSORS(DtProfUp, OETAG_DTPROFUP);
+    OE_DATE_TEXT_ACCESSORS(DtAcctUp, OETAG_DTACCTUP);
+    OE_DATE_TEXT_ACCESSORS(TsKeyExpire, OETAG_TSKEYEXPIRE);
+    OE_TEXT_ACCESSORS(Language, OETAG_LANGUAGE);
+    OE_TEXT_ACCESSORS(Country, OETAG_COUNTRY);
+    OE_TEXT_ACCESSORS(UserKey, OETAG_USERKEY);
+    OE_SET_FROM_TEXT(SessCookie, OETAG_SESSCOOKIE);
+    OE_NUMBER_VALUE_ACCESSORS(KestBid, unsigned long, OETAG_KEST_BID);
+    OE_NUMBER_VALUE_ACCESSORS(KestPid, unsigned long, OETAG_KEST_PRESENCEID);
+    OE_TEXT_ACCESSORS(KestUserId, OETAG_KEST_USERID);
+    OE_SET_FROM_TEXT(KestMktCookie, OETAG_KEST_MKTCOOKIE);
 
     OEOwnedChild m_status, m_fi;
     OEDateTime m_dtServer, m_dtProfUp, m_dtAcctUp, m_tsKeyExpire;
@@ -130,9 +101,8 @@ class OE_API OEPinChangeRq : public OETransBase {
 public:
     explicit OEPinChangeRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetUserId() const { return GetText(OETAG_USERID); }
-    unsigned short SetUserId(const OEString& v) { return SetFromText(OETAG_USERID, v); }
-    unsigned short SetNewUserPass(const OEString& v) { return SetFromText(OETAG_NEWUSERPASS, v); }
+    OE_TEXT_ACCESSORS(UserId, OETAG_USERID);
+    OE_SET_FROM_TEXT(NewUserPass, OETAG_NEWUSERPASS);
 
     OEString32 m_userId;
     OEPassword m_newUserPass;
@@ -143,11 +113,8 @@ class OE_API OEPinChangeRs : public OETransBase {
 public:
     explicit OEPinChangeRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetUserId() const { return GetText(OETAG_USERID); }
-    unsigned short SetUserId(const OEString& v) { return SetFromText(OETAG_USERID, v); }
-    const OEDateTime* GetDateTimeChanged() const { return GetDateTime(OETAG_DTCHANGED); }
-    unsigned short SetDateTimeChanged(const OEString& v) { return SetFromText(OETAG_DTCHANGED, v); }
-    unsigned short SetDateTimeChanged(const OEDateTime& v) { return SetDateTime(OETAG_DTCHANGED, v); }
+    OE_TEXT_ACCESSORS(UserId, OETAG_USERID);
+    OE_DATE_ACCESSORS(DateTimeChanged, OETAG_DTCHANGED);
 
     OEString32 m_userId;
     OEDateTime m_dtChanged;

@@ -9,31 +9,15 @@
 class OE_API OEClosingBase : public OEAggregate {
 public:
     explicit OEClosingBase(unsigned short version = 0) : OEAggregate(version) {}
-    const OEString* GetFITId() const { return GetText(OETAG_FITID); }
-    unsigned short SetFITId(const OEString& v) { return SetFromText(OETAG_FITID, v); }
-    const OEDateTime* GetDateOpen() const { return GetDateTime(OETAG_DTOPEN); }
-    unsigned short SetDateOpen(const OEString& v) { return SetFromText(OETAG_DTOPEN, v); }
-    unsigned short SetDateOpen(const OEDateTime& v) { return SetDateTime(OETAG_DTOPEN, v); }
-    const OEDateTime* GetDateClose() const { return GetDateTime(OETAG_DTCLOSE); }
-    unsigned short SetDateClose(const OEString& v) { return SetFromText(OETAG_DTCLOSE, v); }
-    unsigned short SetDateClose(const OEDateTime& v) { return SetDateTime(OETAG_DTCLOSE, v); }
-    const OEDateTime* GetDateNext() const { return GetDateTime(OETAG_DTNEXT); }
-    unsigned short SetDateNext(const OEString& v) { return SetFromText(OETAG_DTNEXT, v); }
-    unsigned short SetDateNext(const OEDateTime& v) { return SetDateTime(OETAG_DTNEXT, v); }
-    const OEPrecisionInteger* GetBalanceOpen() const { return GetAmount(OETAG_BALOPEN); }
-    unsigned short SetBalanceOpen(const OEString& v) { return SetFromText(OETAG_BALOPEN, v); }
-    unsigned short SetBalanceOpen(const OEPrecisionInteger& v) { return SetAmount(OETAG_BALOPEN, v); }
-    const OEPrecisionInteger* GetBalanceClose() const { return GetAmount(OETAG_BALCLOSE); }
-    unsigned short SetBalanceClose(const OEString& v) { return SetFromText(OETAG_BALCLOSE, v); }
-    unsigned short SetBalanceClose(const OEPrecisionInteger& v) { return SetAmount(OETAG_BALCLOSE, v); }
-    const OEDateTime* GetDatePostStart() const { return GetDateTime(OETAG_DTPOSTSTART); }
-    unsigned short SetDatePostStart(const OEString& v) { return SetFromText(OETAG_DTPOSTSTART, v); }
-    unsigned short SetDatePostStart(const OEDateTime& v) { return SetDateTime(OETAG_DTPOSTSTART, v); }
-    const OEDateTime* GetDatePostEnd() const { return GetDateTime(OETAG_DTPOSTEND); }
-    unsigned short SetDatePostEnd(const OEString& v) { return SetFromText(OETAG_DTPOSTEND, v); }
-    unsigned short SetDatePostEnd(const OEDateTime& v) { return SetDateTime(OETAG_DTPOSTEND, v); }
-    const OEString* GetMktgInfo() const { return GetText(OETAG_MKTGINFO); }
-    unsigned short SetMktgInfo(const OEString& v) { return SetFromText(OETAG_MKTGINFO, v); }
+    OE_TEXT_ACCESSORS(FITId, OETAG_FITID);
+    OE_DATE_ACCESSORS(DateOpen, OETAG_DTOPEN);
+    OE_DATE_ACCESSORS(DateClose, OETAG_DTCLOSE);
+    OE_DATE_ACCESSORS(DateNext, OETAG_DTNEXT);
+    OE_AMOUNT_ACCESSORS(BalanceOpen, OETAG_BALOPEN);
+    OE_AMOUNT_ACCESSORS(BalanceClose, OETAG_BALCLOSE);
+    OE_DATE_ACCESSORS(DatePostStart, OETAG_DTPOSTSTART);
+    OE_DATE_ACCESSORS(DatePostEnd, OETAG_DTPOSTEND);
+    OE_TEXT_ACCESSORS(MktgInfo, OETAG_MKTGINFO);
     // CURRENCY and ORIGCURRENCY share one member; the object's own tag says which it is.
     OEDataObj* GetCurrency() const { return m_currency.get(); }
     unsigned short SetCurrency(OEDataObj* currency);
@@ -50,17 +34,11 @@ class OE_API OEClosing : public OEClosingBase {
 public:
     explicit OEClosing(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEPrecisionInteger* GetBalanceMin() const { return GetAmount(OETAG_BALMIN); }
-    unsigned short SetBalanceMin(const OEString& v) { return SetFromText(OETAG_BALMIN, v); }
-    unsigned short SetBalanceMin(const OEPrecisionInteger& v) { return SetAmount(OETAG_BALMIN, v); }
-    const OEPrecisionInteger* GetDepositsAndCredits() const { return GetAmount(OETAG_DEPANDCREDIT); }
-    unsigned short SetDepositsAndCredits(const OEString& v) { return SetFromText(OETAG_DEPANDCREDIT, v); }
-    const OEPrecisionInteger* GetChecksAndDebits() const { return GetAmount(OETAG_CHKANDDEB); }
-    unsigned short SetChecksAndDebits(const OEString& v) { return SetFromText(OETAG_CHKANDDEB, v); }
-    const OEPrecisionInteger* GetTotalFees() const { return GetAmount(OETAG_TOTALFEES); }
-    unsigned short SetTotalFees(const OEString& v) { return SetFromText(OETAG_TOTALFEES, v); }
-    const OEPrecisionInteger* GetTotalInterest() const { return GetAmount(OETAG_TOTALINT); }
-    unsigned short SetTotalInterest(const OEString& v) { return SetFromText(OETAG_TOTALINT, v); }
+    OE_AMOUNT_ACCESSORS(BalanceMin, OETAG_BALMIN);
+    OE_AMOUNT_TEXT_ACCESSORS(DepositsAndCredits, OETAG_DEPANDCREDIT);
+    OE_AMOUNT_TEXT_ACCESSORS(ChecksAndDebits, OETAG_CHKANDDEB);
+    OE_AMOUNT_TEXT_ACCESSORS(TotalFees, OETAG_TOTALFEES);
+    OE_AMOUNT_TEXT_ACCESSORS(TotalInterest, OETAG_TOTALINT);
 
     OEPrecisionInteger m_balMin, m_depAndCredit, m_chkAndDeb, m_totalFees, m_totalInt;
 };
@@ -70,21 +48,13 @@ class OE_API OECCClosing : public OEClosingBase {
 public:
     explicit OECCClosing(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEDateTime* GetDatePaymentDue() const { return GetDateTime(OETAG_DTPMTDUE); }
-    unsigned short SetDatePaymentDue(const OEString& v) { return SetFromText(OETAG_DTPMTDUE, v); }
-    unsigned short SetDatePaymentDue(const OEDateTime& v) { return SetDateTime(OETAG_DTPMTDUE, v); }
-    const OEPrecisionInteger* GetMinPaymentDue() const { return GetAmount(OETAG_MINPMTDUE); }
-    unsigned short SetMinPaymentDue(const OEString& v) { return SetFromText(OETAG_MINPMTDUE, v); }
-    const OEPrecisionInteger* GetFinanceCharge() const { return GetAmount(OETAG_FINCHG); }
-    unsigned short SetFinanceCharge(const OEString& v) { return SetFromText(OETAG_FINCHG, v); }
-    const OEPrecisionInteger* GetPaymentsAndCredits() const { return GetAmount(OETAG_PAYANDCREDIT); }
-    unsigned short SetPaymentsAndCredits(const OEString& v) { return SetFromText(OETAG_PAYANDCREDIT, v); }
-    const OEPrecisionInteger* GetPurchasesAndAdvances() const { return GetAmount(OETAG_PURANDADV); }
-    unsigned short SetPurchasesAndAdvances(const OEString& v) { return SetFromText(OETAG_PURANDADV, v); }
-    const OEPrecisionInteger* GetDebitAdjustments() const { return GetAmount(OETAG_DEBADJ); }
-    unsigned short SetDebitAdjustments(const OEString& v) { return SetFromText(OETAG_DEBADJ, v); }
-    const OEPrecisionInteger* GetCreditLimit() const { return GetAmount(OETAG_CREDITLIMIT); }
-    unsigned short SetCreditLimit(const OEString& v) { return SetFromText(OETAG_CREDITLIMIT, v); }
+    OE_DATE_ACCESSORS(DatePaymentDue, OETAG_DTPMTDUE);
+    OE_AMOUNT_TEXT_ACCESSORS(MinPaymentDue, OETAG_MINPMTDUE);
+    OE_AMOUNT_TEXT_ACCESSORS(FinanceCharge, OETAG_FINCHG);
+    OE_AMOUNT_TEXT_ACCESSORS(PaymentsAndCredits, OETAG_PAYANDCREDIT);
+    OE_AMOUNT_TEXT_ACCESSORS(PurchasesAndAdvances, OETAG_PURANDADV);
+    OE_AMOUNT_TEXT_ACCESSORS(DebitAdjustments, OETAG_DEBADJ);
+    OE_AMOUNT_TEXT_ACCESSORS(CreditLimit, OETAG_CREDITLIMIT);
 
     OEDateTime m_dtPmtDue;
     OEPrecisionInteger m_minPmtDue, m_finChg, m_payAndCredit, m_purAndAdv, m_debAdj, m_creditLimit;
@@ -118,8 +88,7 @@ public:
 class OE_API OEStatementEndRsBase : public OETransBase {
 public:
     explicit OEStatementEndRsBase(unsigned short version = 0) : OETransBase(version), m_closings(1, 12) {}
-    const OEString* GetCurDef() const { return GetText(OETAG_CURDEF); }
-    unsigned short SetCurDef(const OEString& v) { return SetFromText(OETAG_CURDEF, v); }
+    OE_TEXT_ACCESSORS(CurDef, OETAG_CURDEF);
     unsigned short GetNumClosing() const { return m_closings.Entries(); }
     void DeleteAllClosing();
 

@@ -29,10 +29,8 @@ public:
     // conversion's own report (no tag) and once against SEVERITY.
     unsigned short SetSeverity(const OEString& text);
     unsigned short SetSeverity(OEStatusSeverity severity);
-    const OEString* GetMessageText() const { return GetText(OETAG_MESSAGE); }
-    unsigned short SetMessageText(const OEString& v) { return SetFromText(OETAG_MESSAGE, v); }
-    const OEString* GetMessage2Text() const { return GetText(OETAG_MESSAGE2); }
-    unsigned short SetMessage2Text(const OEString& v) { return SetFromText(OETAG_MESSAGE2, v); }
+    OE_TEXT_ACCESSORS(MessageText, OETAG_MESSAGE);
+    OE_TEXT_ACCESSORS(Message2Text, OETAG_MESSAGE2);
     OEParseStatus HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) override;
     using OEAggregate::HandleTagElement;
 
@@ -47,10 +45,8 @@ class OE_API OEWarning : public OEAggregate {
 public:
     explicit OEWarning(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetMsgTitle() const { return GetText(OETAG_TITLE); }
-    unsigned short SetMsgTitle(const OEString& v) { return SetFromText(OETAG_TITLE, v); }
-    const OEString* GetMsgBody() const { return GetText(OETAG_MSG); }
-    unsigned short SetMsgBody(const OEString& v) { return SetFromText(OETAG_MSG, v); }
+    OE_TEXT_ACCESSORS(MsgTitle, OETAG_TITLE);
+    OE_TEXT_ACCESSORS(MsgBody, OETAG_MSG);
 
     OEString m_title, m_msg;
 };
@@ -64,10 +60,8 @@ public:
     // Replaces the inner aggregate (the old one is deleted) and marks its tag; null only clears.
     // 0 for an object whose tag is no inner row of the wrapper.
     unsigned short SetActualTrans(OETransBase* inner);
-    const OEString* GetTransUserID() const { return GetText(OETAG_TRNUID); }
-    unsigned short SetTransUserID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
-    const OEString* GetClientCookie() const { return GetText(OETAG_CLTCOOKIE); }
-    unsigned short SetClientCookie(const OEString& v) { return SetFromText(OETAG_CLTCOOKIE, v); }
+    OE_TEXT_ACCESSORS(TransUserID, OETAG_TRNUID);
+    OE_TEXT_ACCESSORS(ClientCookie, OETAG_CLTCOOKIE);
 
     unsigned short CopyExtraFrom(const OEAggregate* other) override {
         m_msgsTag = static_cast<const OETransWrapper*>(other)->m_msgsTag;
@@ -95,13 +89,8 @@ class OE_API OETransRq : public OETransWrapper {
 public:
     explicit OETransRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    const OEString* GetTAN() const { return GetText(OETAG_TAN); }
-    unsigned short SetTAN(const OEString& v) { return SetFromText(OETAG_TAN, v); }
-    unsigned short GetSyncCompleteInfo() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_SYNCCOMPLETEINFO));
-    }
-    unsigned short SetSyncCompleteInfo(const OEString& v) { return SetFromText(OETAG_SYNCCOMPLETEINFO, v); }
-    unsigned short SetSyncCompleteInfo(unsigned short v) { return SetNumber(OETAG_SYNCCOMPLETEINFO, v); }
+    OE_TEXT_ACCESSORS(TAN, OETAG_TAN);
+    OE_NUMBER_ACCESSORS(SyncCompleteInfo, unsigned short, OETAG_SYNCCOMPLETEINFO);
     OETagID GetMsgsRqTag() const { return m_msgsTag; }
     void SetMsgsRqTag(OETagID tag) { m_msgsTag = tag; }
     // Inner request tag to its wrapper tag (STMTRQ gives STMTTRNRQ); 0 for any other tag.
@@ -129,9 +118,9 @@ public:
     // Hands the inner response to the caller (not deleted).
     OETransBase* DisconnectActualTrans();
     OEStatus* GetStatus() const { return static_cast<OEStatus*>(m_status.get()); }
-    unsigned short SetStatus(OEStatus* status) { return SetChildObj(OETAG_STATUS, status); }
+    OE_SET_CHILD(Status, OEStatus, OETAG_STATUS);
     OEWarning* GetWarning() const { return static_cast<OEWarning*>(m_warning.get()); }
-    unsigned short SetWarning(OEWarning* warning) { return SetChildObj(OETAG_WARNING, warning); }
+    OE_SET_CHILD(Warning, OEWarning, OETAG_WARNING);
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
     void SetMsgsRsTag(OETagID tag) { m_msgsTag = tag; }
     // STATUS present with SEVERITY ERROR.
@@ -156,11 +145,7 @@ class OE_API OEMultiTransRq : public OETransRq {
 public:
     explicit OEMultiTransRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendInterRq(OETransBase* rq) { return AppendToList(OETAG_INTERRQ, rq); }
-    OETransBase* GetInterRq(unsigned short index) const {
-        return static_cast<OETransBase*>(m_inter.Get(index));
-    }
-    unsigned short GetNumInterRq() const { return m_inter.Entries(); }
+    OE_LIST_ACCESSORS(InterRq, OETransBase, OETAG_INTERRQ, m_inter);
     // An INTERRQ is made by the creator the plain wrapper has for it: 4 while there is none.
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
     // TRNUID and at least one INTERRQ.
@@ -175,11 +160,7 @@ class OE_API OEMultiTransRs : public OETransRs {
 public:
     explicit OEMultiTransRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendInterRs(OETransBase* rs) { return AppendToList(OETAG_INTERRS, rs); }
-    OETransBase* GetInterRs(unsigned short index) const {
-        return static_cast<OETransBase*>(m_inter.Get(index));
-    }
-    unsigned short GetNumInterRs() const { return m_inter.Entries(); }
+    OE_LIST_ACCESSORS(InterRs, OETransBase, OETAG_INTERRS, m_inter);
     OEParseStatus HandleTagStart(const OETagDictionaryEntry* entry) override;
 
     OEDataObjList m_inter;
@@ -191,10 +172,8 @@ public:
 class OE_API OESyncBase : public OEAggregate {
 public:
     OESyncBase(unsigned short version, bool request);
-    const OEString* GetToken() const { return GetText(OETAG_TOKEN); }
-    unsigned short SetToken(const OEString& v) { return SetFromText(OETAG_TOKEN, v); }
-    const OEString* GetToken2() const { return GetText(OETAG_TOKEN2); }
-    unsigned short SetToken2(const OEString& v) { return SetFromText(OETAG_TOKEN2, v); }
+    OE_TEXT_ACCESSORS(Token, OETAG_TOKEN);
+    OE_TEXT_ACCESSORS(Token2, OETAG_TOKEN2);
     OEDataObj* GetAccount() const { return m_account.get(); }
     // The account aggregate (BANKACCTFROM, CCACCTFROM); it is marked under its own tag.
     unsigned short SetAccount(OEDataObj* account);
@@ -233,27 +212,14 @@ class OE_API OESyncRq : public OESyncBase {
 public:
     explicit OESyncRq(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short GetTokenOnly() const { return static_cast<unsigned short>(GetNumber(OETAG_TOKENONLY)); }
-    unsigned short SetTokenOnly(unsigned short v) { return SetNumber(OETAG_TOKENONLY, v); }
-    unsigned short GetRefresh() const { return static_cast<unsigned short>(GetNumber(OETAG_REFRESH)); }
-    unsigned short SetRefresh(unsigned short v) { return SetNumber(OETAG_REFRESH, v); }
-    unsigned short GetRejectIfMissing() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_REJECTIFMISSING));
-    }
-    unsigned short SetRejectIfMissing(unsigned short v) { return SetNumber(OETAG_REJECTIFMISSING, v); }
-    unsigned short GetIncludeImages() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_INCIMAGES));
-    }
-    unsigned short SetIncludeImages(unsigned short v) { return SetNumber(OETAG_INCIMAGES, v); }
-    unsigned short GetUseHTML() const { return static_cast<unsigned short>(GetNumber(OETAG_USEHTML)); }
-    unsigned short SetUseHTML(unsigned short v) { return SetNumber(OETAG_USEHTML, v); }
-    unsigned long GetSyncError() const { return GetNumber(OETAG_SYNCERROR); }
-    unsigned short SetSyncError(unsigned long v) { return SetNumber(OETAG_SYNCERROR, v); }
-    unsigned short GetKestRefresh() const {
-        return static_cast<unsigned short>(GetNumber(OETAG_KEST_REFRESH));
-    }
-    unsigned short SetKestRefresh(unsigned short v) { return SetNumber(OETAG_KEST_REFRESH, v); }
-    unsigned short SetKestSyncError(unsigned long v) { return SetNumber(OETAG_KEST_SYNCERROR, v); }
+    OE_NUMBER_VALUE_ACCESSORS(TokenOnly, unsigned short, OETAG_TOKENONLY);
+    OE_NUMBER_VALUE_ACCESSORS(Refresh, unsigned short, OETAG_REFRESH);
+    OE_NUMBER_VALUE_ACCESSORS(RejectIfMissing, unsigned short, OETAG_REJECTIFMISSING);
+    OE_NUMBER_VALUE_ACCESSORS(IncludeImages, unsigned short, OETAG_INCIMAGES);
+    OE_NUMBER_VALUE_ACCESSORS(UseHTML, unsigned short, OETAG_USEHTML);
+    OE_NUMBER_VALUE_ACCESSORS(SyncError, unsigned long, OETAG_SYNCERROR);
+    OE_NUMBER_VALUE_ACCESSORS(KestRefresh, unsigned short, OETAG_KEST_REFRESH);
+    OE_SET_NUMBER(KestSyncError, unsigned long, OETAG_KEST_SYNCERROR);
     unsigned short AppendTrans(OETransRq* trans) { return StoreTrans(0, trans, true); }
     unsigned short SetTrans(unsigned short index, OETransRq* trans) {
         return StoreTrans(index, trans, false);
@@ -274,10 +240,8 @@ class OE_API OESyncRs : public OESyncBase {
 public:
     explicit OESyncRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short GetLostSync() const { return static_cast<unsigned short>(GetNumber(OETAG_LOSTSYNC)); }
-    unsigned short SetLostSync(unsigned short v) { return SetNumber(OETAG_LOSTSYNC, v); }
-    const OEString* GetTranUID() const { return GetText(OETAG_TRNUID); }
-    unsigned short SetTranUID(const OEString& v) { return SetFromText(OETAG_TRNUID, v); }
+    OE_NUMBER_VALUE_ACCESSORS(LostSync, unsigned short, OETAG_LOSTSYNC);
+    OE_TEXT_ACCESSORS(TranUID, OETAG_TRNUID);
     unsigned short AppendTrans(OETransRs* trans) { return StoreTrans(0, trans, true); }
     OETransRs* GetTrans(unsigned short index) const { return static_cast<OETransRs*>(m_trans.Get(index)); }
     OETagID GetMsgsRsTag() const { return m_msgsTag; }
