@@ -40,41 +40,43 @@ def public_declarations():
     """Returns (classes, names): classes declared OE_API (plus public class templates) and the
     qualified names ("Util::GetOps", "OEAttachThread") of OE_API functions and variables."""
     classes, names = set(), set()
+    headers = []
     for root, dirs, files in os.walk(SOURCE_DIR):
         dirs[:] = [d for d in dirs if d != "internal"]
         for f in files:
-            if not f.endswith(".h"):
-                continue
-            with open(os.path.join(root, f), encoding="utf-8", errors="replace") as h:
-                text = h.read()
-            # A macro that declares an OE_API class from its first parameter (a family of classes
-            # with the same shape): each use declares that class.
-            for macro, param, body in re.findall(r"#define\s+(\w+)\(\s*(\w+)[^)]*\)((?:[^\n]*\\\n)*[^\n]*)",
-                                                 text):
-                if re.search(r"\b(?:class|struct)\s+OE_API\s+" + param + r"\b", body):
-                    classes.update(re.findall(r"^\s*" + macro + r"\(\s*(\w+)", text, flags=re.M))
-            text = re.sub(r"/\*.*?\*/", " ", text, flags=re.S)
-            text = re.sub(r"//[^\n]*", " ", text)
-            text = re.sub(r"^\s*#[^\n]*", " ", text, flags=re.M)
-            classes.update(re.findall(r"\b(?:class|struct)\s+OE_API\s+(\w+)", text))
-            classes.update(re.findall(r"\btemplate\s*<[^;{]*?>\s*(?:class|struct)\s+(?:OE_API\s+)?(\w+)\s*[:{]",
-                                      text))
-            scope = []  # one entry per open brace: a namespace or class name, or None
-            for m in TOKEN.finditer(text):
-                tok = m.group(0)
-                if m.group(1) or m.group(2):
-                    scope.append(m.group(1) or m.group(2))
-                elif tok == "{":
-                    scope.append(None)
-                elif tok == "}":
-                    if scope:
-                        scope.pop()
-                elif not re.search(r"\b(?:class|struct)\s+$", text[max(0, m.start() - 16):m.start()]):
-                    decl = re.split(r"[;{]", text[m.end():], maxsplit=1)[0]
-                    head = decl.split("(", 1)[0] if "(" in decl else re.split(r"[=\[]", decl)[0]
-                    ids = ["operator"] if re.search(r"\boperator\b", head) else re.findall(r"~?\w+", head)
-                    if ids:
-                        names.add("::".join([s for s in scope if s] + [ids[-1]]))
+            if f.endswith(".h"):
+                with open(os.path.join(root, f), encoding="utf-8", errors="replace") as h:
+                    headers.append(h.read())
+    # A macro that declares an OE_API class from its first parameter (a family of classes with the
+    # same shape): each use, in any header, declares that class.
+    for text in headers:
+        for macro, param, body in re.findall(r"#define\s+(\w+)\(\s*(\w+)[^)]*\)((?:[^\n]*\\\n)*[^\n]*)", text):
+            if re.search(r"\b(?:class|struct)\s+OE_API\s+" + param + r"\b", body):
+                for other in headers:
+                    classes.update(re.findall(r"^\s*" + macro + r"\(\s*(\w+)", other, flags=re.M))
+    for text in headers:
+        text = re.sub(r"/\*.*?\*/", " ", text, flags=re.S)
+        text = re.sub(r"//[^\n]*", " ", text)
+        text = re.sub(r"^\s*#[^\n]*", " ", text, flags=re.M)
+        classes.update(re.findall(r"\b(?:class|struct)\s+OE_API\s+(\w+)", text))
+        classes.update(re.findall(r"\btemplate\s*<[^;{]*?>\s*(?:class|struct)\s+(?:OE_API\s+)?(\w+)\s*[:{]",
+                                  text))
+        scope = []  # one entry per open brace: a namespace or class name, or None
+        for m in TOKEN.finditer(text):
+            tok = m.group(0)
+            if m.group(1) or m.group(2):
+                scope.append(m.group(1) or m.group(2))
+            elif tok == "{":
+                scope.append(None)
+            elif tok == "}":
+                if scope:
+                    scope.pop()
+            elif not re.search(r"\b(?:class|struct)\s+$", text[max(0, m.start() - 16):m.start()]):
+                decl = re.split(r"[;{]", text[m.end():], maxsplit=1)[0]
+                head = decl.split("(", 1)[0] if "(" in decl else re.split(r"[=\[]", decl)[0]
+                ids = ["operator"] if re.search(r"\boperator\b", head) else re.findall(r"~?\w+", head)
+                if ids:
+                    names.add("::".join([s for s in scope if s] + [ids[-1]]))
     return classes, names
 
 

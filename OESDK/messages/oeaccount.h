@@ -121,10 +121,6 @@ public:
 };
 
 // PAYEE2: the same elements, all optional but NAME.
-class OE_API OEPayee2 : public OEPayee {
-public:
-    explicit OEPayee2(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OEPayee2, OEPayee);
 
 #endif

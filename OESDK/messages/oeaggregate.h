@@ -372,4 +372,20 @@ public:
         list.DeleteAll();                                                                                    \
     }
 
+// A class that adds nothing to its base (`...`, which may be a template with commas) but its own
+// tables: it declares the constructor and Describe, which OE_AGGREGATE_DEFINE defines. An
+// invocation ends with a semicolon.
+#define OE_AGGREGATE_CLASS(C, ...)                                                                           \
+    class OE_API C : public __VA_ARGS__ {                                                                    \
+    public:                                                                                                  \
+        explicit C(unsigned short version = 0);                                                              \
+        const OEAggregateDesc& Describe() const override;                                                    \
+    }
+
+// OE_AGGREGATE_DEFINE with the descriptor made in place from the class's static tables, for the
+// classes whose descriptor is a plain OE_DESC: one line a class in its source file.
+#define OE_AGGREGATE_DEFINE_TABLES(C, Base, tag, valid, required, fields)                                    \
+    static const OEAggregateDesc k##C##Desc = OE_DESC(tag, valid, required, fields);                         \
+    OE_AGGREGATE_DEFINE(C, Base, k##C##Desc, tag)
+
 #endif

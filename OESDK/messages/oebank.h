@@ -122,19 +122,11 @@ public:
 };
 
 // STMTRS.
-class OE_API OEBankStatementRs
-    : public OEAccountFromOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM> {
-public:
-    explicit OEBankStatementRs(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OEBankStatementRs,
+                   OEAccountFromOf<OEGenericStatementRs, OEBankAccount, OETAG_BANKACCTFROM>);
 
 // CCSTMTRS: the same with CCACCTFROM.
-class OE_API OECCStatementRs : public OEAccountFromOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM> {
-public:
-    explicit OECCStatementRs(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OECCStatementRs, OEAccountFromOf<OEGenericStatementRs, OECCAccount, OETAG_CCACCTFROM>);
 
 // The base of the statement requests: one account and at most one INCTRAN.
 class OE_API OEGenericStatementRq : public OETransBase {
@@ -149,18 +141,10 @@ public:
 };
 
 // STMTRQ.
-class OE_API OEBankStatementRq
-    : public OEAccountFromOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM> {
-public:
-    explicit OEBankStatementRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OEBankStatementRq,
+                   OEAccountFromOf<OEGenericStatementRq, OEBankAccount, OETAG_BANKACCTFROM>);
 
 // CCSTMTRQ.
-class OE_API OECCStatementRq : public OEAccountFromOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM> {
-public:
-    explicit OECCStatementRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OECCStatementRq, OEAccountFromOf<OEGenericStatementRq, OECCAccount, OETAG_CCACCTFROM>);
 
 #endif

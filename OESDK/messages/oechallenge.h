@@ -16,11 +16,7 @@ public:
 };
 
 // CHALLENGERQ: USERID (required) and FICERTID.
-class OE_API OEChallengeRq : public OEChallengeBase {
-public:
-    explicit OEChallengeRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OEChallengeRq, OEChallengeBase);
 
 // CHALLENGERS: USERID, NONCE and FICERTID, all required.
 class OE_API OEChallengeRs : public OEChallengeBase {

@@ -385,97 +385,69 @@ const OEFieldRow kPosListFields[] = {
             static_cast<unsigned short>(sizeof(required) / sizeof(required[0])), fields, n                   \
     }
 
-const OEAggregateDesc kAcctDesc = OE_DESC(OETAG_INVACCTFROM, kAcctValid, kAcctValid, kAcctFields);
-const OEAggregateDesc kIncPosDesc = OE_DESC(OETAG_INCPOS, kIncPosValid, kIncPosRequired, kIncPosFields);
-const OEAggregateDesc kRqDesc = OE_DESC(OETAG_INVSTMTRQ, kRqValid, kRqRequired, kRqFields);
-const OEAggregateDesc kRsDesc = OE_DESC(OETAG_INVSTMTRS, kRsValid, kRsRequired, kRsFields);
-const OEAggregateDesc kTranDesc = OE_DESC(OETAG_INVTRAN, kTranValid, kTranRequired, kTranFields);
-const OEAggregateDesc kBankTranDesc =
-    OE_DESC(OETAG_INVBANKTRAN, kBankTranValid, kBankTranValid, kBankTranFields);
-const OEAggregateDesc kBuyDesc = OE_DESC(OETAG_INVBUY, kBuyValid, kTradeRequired, kBuyFields);
-const OEAggregateDesc kSellDesc = OE_DESC(OETAG_INVSELL, kSellValid, kTradeRequired, kSellFields);
-const OEAggregateDesc kBuyStockDesc =
-    OE_DESC(OETAG_BUYSTOCK, kBuyStockValid, kBuyStockValid, kBuyStockFields);
-const OEAggregateDesc kBuyMFDesc = OE_DESC(OETAG_BUYMF, kBuyMFValid, kBuyMFRequired, kBuyMFFields);
-const OEAggregateDesc kBuyDebtDesc = OE_DESC(OETAG_BUYDEBT, kBuyDebtValid, kBuyOnly, kBuyDebtFields);
-const OEAggregateDesc kBuyOptDesc = OE_DESC(OETAG_BUYOPT, kBuyOptValid, kBuyOptValid, kBuyOptFields);
-const OEAggregateDesc kBuyOtherDesc = OE_DESC(OETAG_BUYOTHER, kBuyOtherValid, kBuyOnly, kBuyOtherFields);
-const OEAggregateDesc kSellStockDesc =
-    OE_DESC(OETAG_SELLSTOCK, kSellStockValid, kSellStockValid, kSellStockFields);
-const OEAggregateDesc kSellMFDesc = OE_DESC(OETAG_SELLMF, kSellMFValid, kSellMFRequired, kSellMFFields);
-const OEAggregateDesc kSellDebtDesc =
-    OE_DESC(OETAG_SELLDEBT, kSellDebtValid, kSellDebtRequired, kSellDebtFields);
-const OEAggregateDesc kSellOptDesc = OE_DESC(OETAG_SELLOPT, kSellOptValid, kSellOptRequired, kSellOptFields);
-const OEAggregateDesc kSellOtherDesc = OE_DESC(OETAG_SELLOTHER, kSellOtherValid, kSellOnly, kSellOtherFields);
-const OEAggregateDesc kIncomeDesc = OE_DESC(OETAG_INCOME, kIncomeValid, kIncomeRequired, kIncomeFields);
-const OEAggregateDesc kReinvestDesc =
-    OE_DESC(OETAG_REINVEST, kReinvestValid, kReinvestRequired, kReinvestFields);
-const OEAggregateDesc kRetOfCapDesc =
-    OE_DESC(OETAG_RETOFCAP, kRetOfCapValid, kRetOfCapRequired, kRetOfCapFields);
-const OEAggregateDesc kInvExpenseDesc =
-    OE_DESC(OETAG_INVEXPENSE, kRetOfCapValid, kRetOfCapRequired, kRetOfCapFields);
-const OEAggregateDesc kSplitDesc = OE_DESC(OETAG_SPLIT, kSplitValid, kSplitRequired, kSplitFields);
-const OEAggregateDesc kTransferDesc =
-    OE_DESC(OETAG_TRANSFER, kTransferValid, kTransferRequired, kTransferFields);
-const OEAggregateDesc kJrnlFundDesc =
-    OE_DESC(OETAG_JRNLFUND, kJrnlFundValid, kJrnlFundValid, kJrnlFundFields);
-const OEAggregateDesc kJrnlSecDesc = OE_DESC(OETAG_JRNLSEC, kJrnlSecValid, kJrnlSecValid, kJrnlSecFields);
-const OEAggregateDesc kMarginDesc =
-    OE_DESC(OETAG_MARGININTEREST, kMarginValid, kMarginRequired, kMarginFields);
-const OEAggregateDesc kClosureDesc =
-    OE_DESC(OETAG_CLOSUREOPT, kClosureValid, kClosureRequired, kClosureFields);
-const OEAggregateDesc kTranListDesc =
-    OE_DESC(OETAG_INVTRANLIST, kTranListValid, kTranListRequired, kTranListFields);
 const OEAggregateDesc kBalListDesc = OE_DESC_NO_REQUIRED(OETAG_BALLIST, kBalListValid, kBalListFields);
-const OEAggregateDesc kInvBalDesc = OE_DESC(OETAG_INVBAL, kInvBalValid, kInvBalRequired, kInvBalFields);
-const OEAggregateDesc kPosDesc = OE_DESC(OETAG_INVPOS, kPosValid, kPosRequired, kPosFields);
 const OEAggregateDesc kPosStockDesc =
     OE_DESC_PREFIX(OETAG_POSSTOCK, kPosStockValid, kInvPosOnly, kPosMFFields, 4);
-const OEAggregateDesc kPosMFDesc = OE_DESC(OETAG_POSMF, kPosMFValid, kInvPosOnly, kPosMFFields);
 const OEAggregateDesc kPosDebtDesc = OE_DESC_PREFIX(OETAG_POSDEBT, kInvPosOnly, kInvPosOnly, kPosMFFields, 1);
-const OEAggregateDesc kPosOptDesc = OE_DESC(OETAG_POSOPT, kPosOptValid, kInvPosOnly, kPosOptFields);
 const OEAggregateDesc kPosOtherDesc =
     OE_DESC_PREFIX(OETAG_POSOTHER, kInvPosOnly, kInvPosOnly, kPosMFFields, 1);
 const OEAggregateDesc kPosListDesc = OE_DESC_NO_REQUIRED(OETAG_INVPOSLIST, kPosListValid, kPosListFields);
 
 } // namespace
 
-OE_AGGREGATE_DEFINE(OEInvAcctFrom, OEAggregate, kAcctDesc, OETAG_INVACCTFROM)
-OE_AGGREGATE_DEFINE(OEIncPos, OEAggregate, kIncPosDesc, OETAG_INCPOS)
-OE_AGGREGATE_DEFINE(OEInvStmtRq, OEAccountFromOf, kRqDesc, OETAG_INVSTMTRQ)
-OE_AGGREGATE_DEFINE(OEInvStmtRs, OEAccountFromOf, kRsDesc, OETAG_INVSTMTRS)
-OE_AGGREGATE_DEFINE(OEInvTran, OEAggregate, kTranDesc, OETAG_INVTRAN)
-OE_AGGREGATE_DEFINE(OEInvBankTran, OEInvestmentTx, kBankTranDesc, OETAG_INVBANKTRAN)
-OE_AGGREGATE_DEFINE(OEInvBuy, OEInvestmentTx, kBuyDesc, OETAG_INVBUY)
-OE_AGGREGATE_DEFINE(OEInvSell, OEInvestmentTx, kSellDesc, OETAG_INVSELL)
-OE_AGGREGATE_DEFINE(OEBuyStock, OEBuyTrade, kBuyStockDesc, OETAG_BUYSTOCK)
-OE_AGGREGATE_DEFINE(OEBuyMF, OEBuyTrade, kBuyMFDesc, OETAG_BUYMF)
-OE_AGGREGATE_DEFINE(OEBuyDebt, OEBuyTrade, kBuyDebtDesc, OETAG_BUYDEBT)
-OE_AGGREGATE_DEFINE(OEBuyOpt, OEBuyTrade, kBuyOptDesc, OETAG_BUYOPT)
-OE_AGGREGATE_DEFINE(OEBuyOther, OEBuyTrade, kBuyOtherDesc, OETAG_BUYOTHER)
-OE_AGGREGATE_DEFINE(OESellStock, OESellTrade, kSellStockDesc, OETAG_SELLSTOCK)
-OE_AGGREGATE_DEFINE(OESellMF, OESellTrade, kSellMFDesc, OETAG_SELLMF)
-OE_AGGREGATE_DEFINE(OESellDebt, OESellTrade, kSellDebtDesc, OETAG_SELLDEBT)
-OE_AGGREGATE_DEFINE(OESellOpt, OESellTrade, kSellOptDesc, OETAG_SELLOPT)
-OE_AGGREGATE_DEFINE(OESellOther, OESellTrade, kSellOtherDesc, OETAG_SELLOTHER)
-OE_AGGREGATE_DEFINE(OEIncome, OEOtherInvestmentTx, kIncomeDesc, OETAG_INCOME)
-OE_AGGREGATE_DEFINE(OEReinvest, OEOtherInvestmentTx, kReinvestDesc, OETAG_REINVEST)
-OE_AGGREGATE_DEFINE(OERetOfCap, OEOtherInvestmentTx, kRetOfCapDesc, OETAG_RETOFCAP)
-OE_AGGREGATE_DEFINE(OESplit, OEOtherInvestmentTx, kSplitDesc, OETAG_SPLIT)
-OE_AGGREGATE_DEFINE(OETransfer, OEOtherInvestmentTx, kTransferDesc, OETAG_TRANSFER)
-OE_AGGREGATE_DEFINE(OEJrnlFund, OEOtherInvestmentTx, kJrnlFundDesc, OETAG_JRNLFUND)
-OE_AGGREGATE_DEFINE(OEJrnlSec, OEOtherInvestmentTx, kJrnlSecDesc, OETAG_JRNLSEC)
-OE_AGGREGATE_DEFINE(OEMarginInterest, OEOtherInvestmentTx, kMarginDesc, OETAG_MARGININTEREST)
-OE_AGGREGATE_DEFINE(OEClosureOpt, OEOtherInvestmentTx, kClosureDesc, OETAG_CLOSUREOPT)
-OE_AGGREGATE_DEFINE(OEInvExpense, OEOtherInvestmentTx, kInvExpenseDesc, OETAG_INVEXPENSE)
-OE_AGGREGATE_DEFINE(OEInvTranList, OEDateRangeOf, kTranListDesc, OETAG_INVTRANLIST)
+OE_AGGREGATE_DEFINE_TABLES(OEInvAcctFrom, OEAggregate, OETAG_INVACCTFROM, kAcctValid, kAcctValid, kAcctFields)
+OE_AGGREGATE_DEFINE_TABLES(OEIncPos, OEAggregate, OETAG_INCPOS, kIncPosValid, kIncPosRequired, kIncPosFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvStmtRq, OEAccountFromOf, OETAG_INVSTMTRQ, kRqValid, kRqRequired, kRqFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvStmtRs, OEAccountFromOf, OETAG_INVSTMTRS, kRsValid, kRsRequired, kRsFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvTran, OEAggregate, OETAG_INVTRAN, kTranValid, kTranRequired, kTranFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvBankTran, OEInvestmentTx, OETAG_INVBANKTRAN, kBankTranValid, kBankTranValid,
+                           kBankTranFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvBuy, OEInvestmentTx, OETAG_INVBUY, kBuyValid, kTradeRequired, kBuyFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvSell, OEInvestmentTx, OETAG_INVSELL, kSellValid, kTradeRequired, kSellFields)
+OE_AGGREGATE_DEFINE_TABLES(OEBuyStock, OEBuyTrade, OETAG_BUYSTOCK, kBuyStockValid, kBuyStockValid,
+                           kBuyStockFields)
+OE_AGGREGATE_DEFINE_TABLES(OEBuyMF, OEBuyTrade, OETAG_BUYMF, kBuyMFValid, kBuyMFRequired, kBuyMFFields)
+OE_AGGREGATE_DEFINE_TABLES(OEBuyDebt, OEBuyTrade, OETAG_BUYDEBT, kBuyDebtValid, kBuyOnly, kBuyDebtFields)
+OE_AGGREGATE_DEFINE_TABLES(OEBuyOpt, OEBuyTrade, OETAG_BUYOPT, kBuyOptValid, kBuyOptValid, kBuyOptFields)
+OE_AGGREGATE_DEFINE_TABLES(OEBuyOther, OEBuyTrade, OETAG_BUYOTHER, kBuyOtherValid, kBuyOnly, kBuyOtherFields)
+OE_AGGREGATE_DEFINE_TABLES(OESellStock, OESellTrade, OETAG_SELLSTOCK, kSellStockValid, kSellStockValid,
+                           kSellStockFields)
+OE_AGGREGATE_DEFINE_TABLES(OESellMF, OESellTrade, OETAG_SELLMF, kSellMFValid, kSellMFRequired, kSellMFFields)
+OE_AGGREGATE_DEFINE_TABLES(OESellDebt, OESellTrade, OETAG_SELLDEBT, kSellDebtValid, kSellDebtRequired,
+                           kSellDebtFields)
+OE_AGGREGATE_DEFINE_TABLES(OESellOpt, OESellTrade, OETAG_SELLOPT, kSellOptValid, kSellOptRequired,
+                           kSellOptFields)
+OE_AGGREGATE_DEFINE_TABLES(OESellOther, OESellTrade, OETAG_SELLOTHER, kSellOtherValid, kSellOnly,
+                           kSellOtherFields)
+OE_AGGREGATE_DEFINE_TABLES(OEIncome, OEOtherInvestmentTx, OETAG_INCOME, kIncomeValid, kIncomeRequired,
+                           kIncomeFields)
+OE_AGGREGATE_DEFINE_TABLES(OEReinvest, OEOtherInvestmentTx, OETAG_REINVEST, kReinvestValid, kReinvestRequired,
+                           kReinvestFields)
+OE_AGGREGATE_DEFINE_TABLES(OERetOfCap, OEOtherInvestmentTx, OETAG_RETOFCAP, kRetOfCapValid, kRetOfCapRequired,
+                           kRetOfCapFields)
+OE_AGGREGATE_DEFINE_TABLES(OESplit, OEOtherInvestmentTx, OETAG_SPLIT, kSplitValid, kSplitRequired,
+                           kSplitFields)
+OE_AGGREGATE_DEFINE_TABLES(OETransfer, OEOtherInvestmentTx, OETAG_TRANSFER, kTransferValid, kTransferRequired,
+                           kTransferFields)
+OE_AGGREGATE_DEFINE_TABLES(OEJrnlFund, OEOtherInvestmentTx, OETAG_JRNLFUND, kJrnlFundValid, kJrnlFundValid,
+                           kJrnlFundFields)
+OE_AGGREGATE_DEFINE_TABLES(OEJrnlSec, OEOtherInvestmentTx, OETAG_JRNLSEC, kJrnlSecValid, kJrnlSecValid,
+                           kJrnlSecFields)
+OE_AGGREGATE_DEFINE_TABLES(OEMarginInterest, OEOtherInvestmentTx, OETAG_MARGININTEREST, kMarginValid,
+                           kMarginRequired, kMarginFields)
+OE_AGGREGATE_DEFINE_TABLES(OEClosureOpt, OEOtherInvestmentTx, OETAG_CLOSUREOPT, kClosureValid,
+                           kClosureRequired, kClosureFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvExpense, OEOtherInvestmentTx, OETAG_INVEXPENSE, kRetOfCapValid,
+                           kRetOfCapRequired, kRetOfCapFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvTranList, OEDateRangeOf, OETAG_INVTRANLIST, kTranListValid, kTranListRequired,
+                           kTranListFields)
 OE_AGGREGATE_DEFINE(OEBalList, OEAggregate, kBalListDesc, OETAG_BALLIST)
-OE_AGGREGATE_DEFINE(OEInvBal, OEAggregate, kInvBalDesc, OETAG_INVBAL)
-OE_AGGREGATE_DEFINE(OEInvPos, OEAggregate, kPosDesc, OETAG_INVPOS)
+OE_AGGREGATE_DEFINE_TABLES(OEInvBal, OEAggregate, OETAG_INVBAL, kInvBalValid, kInvBalRequired, kInvBalFields)
+OE_AGGREGATE_DEFINE_TABLES(OEInvPos, OEAggregate, OETAG_INVPOS, kPosValid, kPosRequired, kPosFields)
 OE_AGGREGATE_DEFINE(OEPosStock, OEPosition, kPosStockDesc, OETAG_POSSTOCK)
-OE_AGGREGATE_DEFINE(OEPosMF, OEPosition, kPosMFDesc, OETAG_POSMF)
+OE_AGGREGATE_DEFINE_TABLES(OEPosMF, OEPosition, OETAG_POSMF, kPosMFValid, kInvPosOnly, kPosMFFields)
 OE_AGGREGATE_DEFINE(OEPosDebt, OEPosition, kPosDebtDesc, OETAG_POSDEBT)
-OE_AGGREGATE_DEFINE(OEPosOpt, OEPosition, kPosOptDesc, OETAG_POSOPT)
+OE_AGGREGATE_DEFINE_TABLES(OEPosOpt, OEPosition, OETAG_POSOPT, kPosOptValid, kInvPosOnly, kPosOptFields)
 OE_AGGREGATE_DEFINE(OEPosOther, OEPosition, kPosOtherDesc, OETAG_POSOTHER)
 OE_AGGREGATE_DEFINE(OEInvPosList, OEMixedList, kPosListDesc, OETAG_INVPOSLIST)
 

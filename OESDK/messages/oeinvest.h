@@ -159,26 +159,20 @@ public:
 typedef OETradeOf<OEInvBuy, OETAG_INVBUY> OEBuyTrade;
 typedef OETradeOf<OEInvSell, OETAG_INVSELL> OESellTrade;
 
-#define OE_INVEST_CLASS(C, Base)                                                                             \
-    class OE_API C : public Base {                                                                           \
-    public:                                                                                                  \
-        explicit C(unsigned short version = 0);                                                              \
-        const OEAggregateDesc& Describe() const override;                                                    \
-    };
 // BUYSTOCK (BUYTYPE), BUYMF (BUYTYPE, RELFITID), BUYDEBT (ACCRDINT), BUYOPT (OPTBUYTYPE,
 // SHPERCTRCT), BUYOTHER (BUYTYPE after version 1).
-OE_INVEST_CLASS(OEBuyStock, OEBuyTrade)
-OE_INVEST_CLASS(OEBuyMF, OEBuyTrade)
-OE_INVEST_CLASS(OEBuyDebt, OEBuyTrade)
-OE_INVEST_CLASS(OEBuyOpt, OEBuyTrade)
-OE_INVEST_CLASS(OEBuyOther, OEBuyTrade)
+OE_AGGREGATE_CLASS(OEBuyStock, OEBuyTrade);
+OE_AGGREGATE_CLASS(OEBuyMF, OEBuyTrade);
+OE_AGGREGATE_CLASS(OEBuyDebt, OEBuyTrade);
+OE_AGGREGATE_CLASS(OEBuyOpt, OEBuyTrade);
+OE_AGGREGATE_CLASS(OEBuyOther, OEBuyTrade);
 // SELLSTOCK (SELLTYPE), SELLMF (SELLTYPE, AVGCOSTBASIS, RELFITID), SELLDEBT (SELLREASON, ACCRDINT),
 // SELLOPT (OPTSELLTYPE, SHPERCTRCT, RELFITID, RELTYPE, SECURED), SELLOTHER (SELLTYPE after version 1).
-OE_INVEST_CLASS(OESellStock, OESellTrade)
-OE_INVEST_CLASS(OESellMF, OESellTrade)
-OE_INVEST_CLASS(OESellDebt, OESellTrade)
-OE_INVEST_CLASS(OESellOpt, OESellTrade)
-OE_INVEST_CLASS(OESellOther, OESellTrade)
+OE_AGGREGATE_CLASS(OESellStock, OESellTrade);
+OE_AGGREGATE_CLASS(OESellMF, OESellTrade);
+OE_AGGREGATE_CLASS(OESellDebt, OESellTrade);
+OE_AGGREGATE_CLASS(OESellOpt, OESellTrade);
+OE_AGGREGATE_CLASS(OESellOther, OESellTrade);
 
 // The other transactions: their own elements beyond OEInvestmentTx are reached by tag.
 class OE_API OEOtherInvestmentTx : public OEInvestmentTx {
@@ -210,16 +204,16 @@ public:
     OEString255 m_relFitId;
     OEOwnedChild m_invAcctFrom;
 };
-OE_INVEST_CLASS(OEIncome, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEReinvest, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OERetOfCap, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OESplit, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OETransfer, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEJrnlFund, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEJrnlSec, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEMarginInterest, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEClosureOpt, OEOtherInvestmentTx)
-OE_INVEST_CLASS(OEInvExpense, OEOtherInvestmentTx)
+OE_AGGREGATE_CLASS(OEIncome, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEReinvest, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OERetOfCap, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OESplit, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OETransfer, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEJrnlFund, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEJrnlSec, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEMarginInterest, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEClosureOpt, OEOtherInvestmentTx);
+OE_AGGREGATE_CLASS(OEInvExpense, OEOtherInvestmentTx);
 
 // INVTRANLIST: DTSTART, DTEND and the transactions of every kind, in the order read or appended.
 class OE_API OEInvTranList : public OEDateRangeOf<OEMixedList> {
@@ -301,12 +295,11 @@ public:
     OEPrecisionInteger m_unitsStreet, m_unitsUser;
     unsigned short m_reinvDiv = 0, m_reinvCG = 0, m_secured = 0;
 };
-OE_INVEST_CLASS(OEPosStock, OEPosition)
-OE_INVEST_CLASS(OEPosMF, OEPosition)
-OE_INVEST_CLASS(OEPosDebt, OEPosition)
-OE_INVEST_CLASS(OEPosOpt, OEPosition)
-OE_INVEST_CLASS(OEPosOther, OEPosition)
-#undef OE_INVEST_CLASS
+OE_AGGREGATE_CLASS(OEPosStock, OEPosition);
+OE_AGGREGATE_CLASS(OEPosMF, OEPosition);
+OE_AGGREGATE_CLASS(OEPosDebt, OEPosition);
+OE_AGGREGATE_CLASS(OEPosOpt, OEPosition);
+OE_AGGREGATE_CLASS(OEPosOther, OEPosition);
 
 // INVPOSLIST: positions of the five kinds, in the order read or appended.
 class OE_API OEInvPosList : public OEMixedList {

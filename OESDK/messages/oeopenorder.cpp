@@ -131,35 +131,27 @@ const OEFieldRow kListFields[] = {
 // DTAUCTION is the one optional element of the kinds: OOBUYDEBT requires its first two rows.
 const OETagRow kBuyDebtRequired[] = {{OETAG_OO, OEVM_ALL, 0}, {OETAG_AUCTION, OEVM_ALL, 0}};
 
-const OEAggregateDesc kOODesc = OE_DESC(OETAG_OO, kOOValid, kOORequired, kOOFields);
-const OEAggregateDesc kBuyDebtDesc =
-    OE_DESC(OETAG_OOBUYDEBT, kBuyDebtValid, kBuyDebtRequired, kBuyDebtFields);
-const OEAggregateDesc kBuyMFDesc = OE_DESC(OETAG_OOBUYMF, kBuyMFValid, kBuyMFValid, kBuyMFFields);
-const OEAggregateDesc kBuyOptDesc = OE_DESC(OETAG_OOBUYOPT, kBuyOptValid, kBuyOptValid, kBuyOptFields);
-const OEAggregateDesc kBuyOtherDesc = OE_DESC(OETAG_OOBUYOTHER, kOtherValid, kOtherValid, kOtherFields);
-const OEAggregateDesc kBuyStockDesc =
-    OE_DESC(OETAG_OOBUYSTOCK, kBuyStockValid, kBuyStockValid, kBuyStockFields);
-const OEAggregateDesc kSellDebtDesc = OE_DESC(OETAG_OOSELLDEBT, kOOOnly, kOOOnly, kOOOnlyFields);
-const OEAggregateDesc kSellMFDesc = OE_DESC(OETAG_OOSELLMF, kSellMFValid, kSellMFValid, kSellMFFields);
-const OEAggregateDesc kSellOptDesc = OE_DESC(OETAG_OOSELLOPT, kSellOptValid, kSellOptValid, kSellOptFields);
-const OEAggregateDesc kSellOtherDesc = OE_DESC(OETAG_OOSELLOTHER, kOtherValid, kOtherValid, kOtherFields);
-const OEAggregateDesc kSellStockDesc =
-    OE_DESC(OETAG_OOSELLSTOCK, kSellStockValid, kSellStockValid, kSellStockFields);
-const OEAggregateDesc kSwitchDesc = OE_DESC(OETAG_OOSWITCHMF, kSwitchValid, kSwitchValid, kSwitchFields);
 const OEAggregateDesc kListDesc = OE_DESC_NO_REQUIRED(OETAG_INVOOLIST, kListValid, kListFields);
 
 } // namespace
 
-OE_AGGREGATE_DEFINE(OEOO, OEAggregate, kOODesc, OETAG_OO)
-OE_AGGREGATE_DEFINE(OEOOBuyDebt, OEOpenOrder, kBuyDebtDesc, OETAG_OOBUYDEBT)
-OE_AGGREGATE_DEFINE(OEOOBuyMF, OEOpenOrder, kBuyMFDesc, OETAG_OOBUYMF)
-OE_AGGREGATE_DEFINE(OEOOBuyOpt, OEOpenOrder, kBuyOptDesc, OETAG_OOBUYOPT)
-OE_AGGREGATE_DEFINE(OEOOBuyOther, OEOpenOrder, kBuyOtherDesc, OETAG_OOBUYOTHER)
-OE_AGGREGATE_DEFINE(OEOOBuyStock, OEOpenOrder, kBuyStockDesc, OETAG_OOBUYSTOCK)
-OE_AGGREGATE_DEFINE(OEOOSellDebt, OEOpenOrder, kSellDebtDesc, OETAG_OOSELLDEBT)
-OE_AGGREGATE_DEFINE(OEOOSellMF, OEOpenOrder, kSellMFDesc, OETAG_OOSELLMF)
-OE_AGGREGATE_DEFINE(OEOOSellOpt, OEOpenOrder, kSellOptDesc, OETAG_OOSELLOPT)
-OE_AGGREGATE_DEFINE(OEOOSellOther, OEOpenOrder, kSellOtherDesc, OETAG_OOSELLOTHER)
-OE_AGGREGATE_DEFINE(OEOOSellStock, OEOpenOrder, kSellStockDesc, OETAG_OOSELLSTOCK)
-OE_AGGREGATE_DEFINE(OEOOSwitchMF, OEOpenOrder, kSwitchDesc, OETAG_OOSWITCHMF)
+OE_AGGREGATE_DEFINE_TABLES(OEOO, OEAggregate, OETAG_OO, kOOValid, kOORequired, kOOFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOBuyDebt, OEOpenOrder, OETAG_OOBUYDEBT, kBuyDebtValid, kBuyDebtRequired,
+                           kBuyDebtFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOBuyMF, OEOpenOrder, OETAG_OOBUYMF, kBuyMFValid, kBuyMFValid, kBuyMFFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOBuyOpt, OEOpenOrder, OETAG_OOBUYOPT, kBuyOptValid, kBuyOptValid, kBuyOptFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOBuyOther, OEOpenOrder, OETAG_OOBUYOTHER, kOtherValid, kOtherValid,
+                           kOtherFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOBuyStock, OEOpenOrder, OETAG_OOBUYSTOCK, kBuyStockValid, kBuyStockValid,
+                           kBuyStockFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSellDebt, OEOpenOrder, OETAG_OOSELLDEBT, kOOOnly, kOOOnly, kOOOnlyFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSellMF, OEOpenOrder, OETAG_OOSELLMF, kSellMFValid, kSellMFValid, kSellMFFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSellOpt, OEOpenOrder, OETAG_OOSELLOPT, kSellOptValid, kSellOptValid,
+                           kSellOptFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSellOther, OEOpenOrder, OETAG_OOSELLOTHER, kOtherValid, kOtherValid,
+                           kOtherFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSellStock, OEOpenOrder, OETAG_OOSELLSTOCK, kSellStockValid, kSellStockValid,
+                           kSellStockFields)
+OE_AGGREGATE_DEFINE_TABLES(OEOOSwitchMF, OEOpenOrder, OETAG_OOSWITCHMF, kSwitchValid, kSwitchValid,
+                           kSwitchFields)
 OE_AGGREGATE_DEFINE(OEInvOOList, OEMixedList, kListDesc, OETAG_INVOOLIST)

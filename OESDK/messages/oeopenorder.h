@@ -63,19 +63,12 @@ public:
 // The kinds whose own elements are all shared ones (held by OEOpenOrder) differ only in their
 // tables: OOBUYMF (BUYTYPE, UNITTYPE), OOBUYOTHER (UNITTYPE), OOBUYSTOCK (BUYTYPE), OOSELLDEBT (nothing
 // beyond the OO), OOSELLOTHER (UNITTYPE) and OOSELLSTOCK (SELLTYPE).
-#define OE_OPEN_ORDER_KIND(C)                                                                                \
-    class OE_API C : public OEOpenOrder {                                                                    \
-    public:                                                                                                  \
-        explicit C(unsigned short version = 0);                                                              \
-        const OEAggregateDesc& Describe() const override;                                                    \
-    }
-OE_OPEN_ORDER_KIND(OEOOBuyMF);
-OE_OPEN_ORDER_KIND(OEOOBuyOther);
-OE_OPEN_ORDER_KIND(OEOOBuyStock);
-OE_OPEN_ORDER_KIND(OEOOSellDebt);
-OE_OPEN_ORDER_KIND(OEOOSellOther);
-OE_OPEN_ORDER_KIND(OEOOSellStock);
-#undef OE_OPEN_ORDER_KIND
+OE_AGGREGATE_CLASS(OEOOBuyMF, OEOpenOrder);
+OE_AGGREGATE_CLASS(OEOOBuyOther, OEOpenOrder);
+OE_AGGREGATE_CLASS(OEOOBuyStock, OEOpenOrder);
+OE_AGGREGATE_CLASS(OEOOSellDebt, OEOpenOrder);
+OE_AGGREGATE_CLASS(OEOOSellOther, OEOpenOrder);
+OE_AGGREGATE_CLASS(OEOOSellStock, OEOpenOrder);
 
 // OOBUYDEBT: a bond to buy, perhaps at auction.
 class OE_API OEOOBuyDebt : public OEOpenOrder {

@@ -233,10 +233,6 @@ public:
 };
 
 // SECLISTRS: an empty acknowledgement; the securities come in the message set's SECLIST.
-class OE_API OESecListRs : public OETransBase {
-public:
-    explicit OESecListRs(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OESecListRs, OETransBase);
 
 #endif

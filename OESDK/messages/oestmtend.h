@@ -69,20 +69,11 @@ public:
 };
 
 // STMTENDRQ.
-class OE_API OEStatementEndRq
-    : public OEAccountFromOf<OEStatementEndRqBase, OEBankAccount, OETAG_BANKACCTFROM> {
-public:
-    explicit OEStatementEndRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OEStatementEndRq,
+                   OEAccountFromOf<OEStatementEndRqBase, OEBankAccount, OETAG_BANKACCTFROM>);
 
 // CCSTMTENDRQ.
-class OE_API OECCStatementEndRq
-    : public OEAccountFromOf<OEStatementEndRqBase, OECCAccount, OETAG_CCACCTFROM> {
-public:
-    explicit OECCStatementEndRq(unsigned short version = 0);
-    const OEAggregateDesc& Describe() const override;
-};
+OE_AGGREGATE_CLASS(OECCStatementEndRq, OEAccountFromOf<OEStatementEndRqBase, OECCAccount, OETAG_CCACCTFROM>);
 
 // The statement-end responses: CURDEF, the account and the closings in order.
 class OE_API OEStatementEndRsBase : public OETransBase {
