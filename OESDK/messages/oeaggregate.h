@@ -330,14 +330,16 @@ public:
 #define OE_CHILD_ACCESSORS(Name, Type, tag) OE_GET_CHILD(Name, Type, tag) OE_SET_CHILD(Name, Type, tag)
 
 // A list row held in the member `list` (an OEDataObjList): AppendName(Type*) (the list owns the
-// entry afterwards), GetName(index) (null past the end) and GetNumName().
-#define OE_LIST_ACCESSORS(Name, Type, tag, list)                                                             \
+// entry afterwards) and GetName(index) (null past the end); OE_LIST_ACCESSORS adds GetNumName().
+#define OE_LIST_ITEMS(Name, Type, tag, list)                                                                 \
     unsigned short Append##Name(Type* v) {                                                                   \
         return this->AppendToList(tag, v);                                                                   \
     }                                                                                                        \
     Type* Get##Name(unsigned short index) const {                                                            \
         return static_cast<Type*>(list.Get(index));                                                          \
-    }                                                                                                        \
+    }
+#define OE_LIST_ACCESSORS(Name, Type, tag, list)                                                             \
+    OE_LIST_ITEMS(Name, Type, tag, list)                                                                     \
     unsigned short GetNum##Name() const {                                                                    \
         return list.Entries();                                                                               \
     }

@@ -94,10 +94,7 @@ class OE_API OEStatementEndRs
 public:
     explicit OEStatementEndRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendClosing(OEClosing* c) { return AppendToList(OETAG_CLOSING, c); }
-    OEClosing* GetClosing(unsigned short index) const {
-        return static_cast<OEClosing*>(m_closings.Get(index));
-    }
+    OE_LIST_ITEMS(Closing, OEClosing, OETAG_CLOSING, m_closings); // the count: GetNumClosing of the base
 };
 
 // CCSTMTENDRS.
@@ -106,10 +103,7 @@ class OE_API OECCStatementEndRs
 public:
     explicit OECCStatementEndRs(unsigned short version = 0);
     const OEAggregateDesc& Describe() const override;
-    unsigned short AppendClosing(OECCClosing* c) { return AppendToList(OETAG_CCCLOSING, c); }
-    OECCClosing* GetClosing(unsigned short index) const {
-        return static_cast<OECCClosing*>(m_closings.Get(index));
-    }
+    OE_LIST_ITEMS(Closing, OECCClosing, OETAG_CCCLOSING, m_closings); // the count: GetNumClosing of the base
 };
 
 #endif
