@@ -26,7 +26,7 @@ OEString::OEString(const char* text, unsigned short length) : OEString() {
 }
 
 OEString::OEString(const OEString& other) : OEString() {
-    if (other.m_length) Assign(other.m_buffer, other.m_length);
+    if (other.m_length) CopyText(other.m_buffer, other.m_length);
     m_encoding = other.m_encoding;
     m_specLength = other.m_specLength;
 }
@@ -44,22 +44,34 @@ OEString::~OEString() {
 }
 
 void OEString::FreeBuffer() {
-    OEMemory::Free(m_buffer);
+    OEMemory::PoolFree(m_buffer);
     m_buffer = nullptr;
     m_bufferSize = 0;
     m_length = 0;
 }
 
-unsigned short OEString::AllocStringBuffer(unsigned short size) {
-    if (size <= m_bufferSize) return 1;
-    char* grown = static_cast<char*>(m_buffer ? OEMemory::Realloc(m_buffer, size) : OEMemory::Calloc(size));
+// Buffers come from the block pool: a string's buffer is small, short-lived and one of many.
+// Growing moves the text into a block of exactly the new size, as a reallocation would.
+unsigned short OEString::GrowBuffer(unsigned short size, bool zeroFirst) {
+    char* grown = static_cast<char*>(OEMemory::PoolAllocBytes(size));
     if (!grown) {
         FreeBuffer();
         return 0;
     }
+    if (m_buffer) {
+        std::memcpy(grown, m_buffer, m_bufferSize);
+        OEMemory::PoolFree(m_buffer);
+    } else if (zeroFirst) {
+        std::memset(grown, 0, size);
+    }
     m_buffer = grown;
     m_bufferSize = size;
     return 1;
+}
+
+unsigned short OEString::AllocStringBuffer(unsigned short size) {
+    if (size <= m_bufferSize) return 1;
+    return GrowBuffer(size, true);
 }
 
 unsigned short OEString::CopyString(const char* text) {
@@ -90,7 +102,14 @@ unsigned short OEString::Assign(const char* text, unsigned short length) {
         m_length = length;
         return 1;
     }
-    if (!AllocStringBuffer(static_cast<unsigned short>(length + 1))) return 0;
+    return CopyText(text, length);
+}
+
+// The copy-in of `length` bytes (1 to kMaxLength) that hold no NUL and do not lie in our buffer.
+// A first buffer is filled whole by the copy, so it is taken without zero-filling.
+unsigned short OEString::CopyText(const char* text, unsigned short length) {
+    const unsigned short size = static_cast<unsigned short>(length + 1);
+    if (size > m_bufferSize && !GrowBuffer(size, false)) return 0;
     std::memcpy(m_buffer, text, length);
     m_buffer[length] = 0;
     m_length = length;
@@ -102,7 +121,8 @@ OEString& OEString::operator=(const OEString& other) {
     if (other.m_length == 0) {
         FreeBuffer();
     } else {
-        Assign(other.m_buffer, other.m_length);
+        // Another string's text holds no NUL and is never inside our buffer.
+        CopyText(other.m_buffer, other.m_length);
     }
     m_encoding = other.m_encoding;
     m_specLength = other.m_specLength;
