@@ -58,29 +58,96 @@ OEEnumWriter EnumWriterFor(const OEKeywordTable* table) {
 
 namespace {
 
-// Case-insensitive keyword match over a table; the index or -1.
+// Case-insensitive keyword match over a table: the index of the first word equal to the text
+// ignoring ASCII case, or -1. Each table gets, on first use, a small hash of its words by length
+// and first eight letters in upper case, so a match is a probe or two instead of a walk.
 inline char UpperAscii(char c) {
     return (c >= 'a' && c <= 'z') ? static_cast<char>(c - 32) : c;
 }
 
-int MatchKeyword(const OEKeywordTable* table, const char* text) {
-    if (!table) return -1;
-    const char first = UpperAscii(*text);
-    for (unsigned short i = 0; i < table->m_count; ++i) {
-        const char* a = table->m_words[i];
-        if (UpperAscii(*a) != first) continue; // most keywords differ in their first letter
-        const char* b = text;
-        while (*a && *b) {
-            char ca = *a, cb = *b;
-            if (ca >= 'a' && ca <= 'z') ca = static_cast<char>(ca - 32);
-            if (cb >= 'a' && cb <= 'z') cb = static_cast<char>(cb - 32);
-            if (ca != cb) break;
-            ++a;
-            ++b;
-        }
-        if (!*a && !*b) return i;
+bool SameIgnoringCase(const char* a, const char* b, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i)
+        if (UpperAscii(a[i]) != UpperAscii(b[i])) return false;
+    return true;
+}
+
+// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded.
+inline std::uint64_t UpperKey(const char* text, std::size_t length) {
+    std::uint64_t key = 0;
+    const std::size_t n = length < 8 ? length : 8;
+    for (std::size_t i = 0; i < n; ++i)
+        key |= std::uint64_t(static_cast<unsigned char>(UpperAscii(text[i]))) << (8 * i);
+    return key;
+}
+
+struct KeywordLookup {
+    struct Slot {
+        std::uint64_t m_key;
+        unsigned short m_length; // 0: empty
+        unsigned short m_index;
+    };
+    unsigned m_mask;
+    Slot* m_slots;
+
+    static unsigned Hash(std::uint64_t key, std::size_t length) {
+        const std::uint64_t h = (key ^ length) * 0x9E3779B97F4A7C15ull;
+        return static_cast<unsigned>(h >> 40);
     }
-    return -1;
+    int Find(const OEKeywordTable& table, const char* text, std::size_t length) const {
+        const std::uint64_t key = UpperKey(text, length);
+        for (unsigned i = Hash(key, length) & m_mask;; i = (i + 1) & m_mask) {
+            const Slot& s = m_slots[i];
+            if (s.m_length == 0) return -1;
+            if (s.m_key == key && s.m_length == length &&
+                (length <= 8 || SameIgnoringCase(table.m_words[s.m_index] + 8, text + 8, length - 8)))
+                return s.m_index;
+        }
+    }
+};
+
+const KeywordLookup* BuildKeywordLookup(const OEKeywordTable& table) {
+    unsigned size = 8;
+    while (size < 2u * table.m_count) size *= 2;
+    unsigned char* block = new (std::nothrow) unsigned char[sizeof(KeywordLookup) + size * sizeof(KeywordLookup::Slot)];
+    if (!block) return nullptr;
+    KeywordLookup* lookup = new (block) KeywordLookup;
+    lookup->m_mask = size - 1;
+    lookup->m_slots = reinterpret_cast<KeywordLookup::Slot*>(block + sizeof(KeywordLookup));
+    for (unsigned i = 0; i < size; ++i) lookup->m_slots[i] = KeywordLookup::Slot{0, 0, 0};
+    for (unsigned short w = 0; w < table.m_count; ++w) {
+        const char* word = table.m_words[w];
+        const std::size_t length = word ? std::strlen(word) : 0;
+        if (length == 0 || length > 0xFFFF) continue; // never matched: texts are not empty here
+        if (lookup->Find(table, word, length) >= 0) continue; // an earlier word already answers
+        const std::uint64_t key = UpperKey(word, length);
+        unsigned i = KeywordLookup::Hash(key, length) & lookup->m_mask;
+        while (lookup->m_slots[i].m_length) i = (i + 1) & lookup->m_mask;
+        lookup->m_slots[i] = KeywordLookup::Slot{key, static_cast<unsigned short>(length), w};
+    }
+    return lookup;
+}
+
+int MatchKeyword(const OEKeywordTable* table, const char* text, std::size_t length) {
+    if (!table || length == 0) return -1;
+    const void* cached = table->m_lookup.load(std::memory_order_acquire);
+    if (!cached) {
+        const KeywordLookup* fresh = BuildKeywordLookup(*table);
+        if (!fresh) { // no memory for the lookup: walk the table
+            for (unsigned short i = 0; i < table->m_count; ++i) {
+                const char* word = table->m_words[i];
+                if (word && std::strlen(word) == length && SameIgnoringCase(word, text, length)) return i;
+            }
+            return -1;
+        }
+        // Another thread may have been first; the loser's lookup is dropped. Lookups live as long
+        // as the process, like the descriptors' indexes.
+        if (table->m_lookup.compare_exchange_strong(cached, fresh, std::memory_order_acq_rel)) {
+            cached = fresh;
+        } else {
+            delete[] reinterpret_cast<const unsigned char*>(fresh);
+        }
+    }
+    return static_cast<const KeywordLookup*>(cached)->Find(*table, text, length);
 }
 
 // Strict decimal number: optional sign, digits only.
@@ -428,7 +495,7 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
     case OEFK_TEXTLIST:
         return AppendText(tag, text);
     case OEFK_ENUM: {
-        int keyword = MatchKeyword(row->m_keywords, s);
+        int keyword = MatchKeyword(row->m_keywords, s, text.GetStrLength());
         if (keyword < 0) break;
         *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
         SetPresentBit(mark);
