@@ -98,6 +98,10 @@ struct Cursor {
     Slab* m_slab;
     bool m_ended;
 };
+#if defined(__ELF__)
+// Initial-exec: the cursor is reached without a call into the dynamic linker on every block.
+__attribute__((tls_model("initial-exec")))
+#endif
 thread_local Cursor t_cursor = {nullptr, false};
 
 struct CursorGuard {
@@ -169,7 +173,8 @@ inline void* PoolCut(std::size_t bytes, std::size_t align) {
 }
 
 inline void* HookedCut(std::size_t bytes, std::size_t align) {
-    void* block = ShouldFail(bytes) ? nullptr : PoolCut(bytes, align);
+    const FailureHook hook = g_failureHook.load(std::memory_order_relaxed);
+    void* block = (hook && hook(bytes)) ? nullptr : PoolCut(bytes, align);
     if (!block) ReportFailure();
     return block;
 }
