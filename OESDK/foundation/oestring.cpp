@@ -10,6 +10,25 @@ const char kCdataOpen[] = "<![CDATA[";
 const unsigned short kCdataOpenLength = 9;
 const unsigned short kCdataCloseLength = 3;
 
+// A copy of n bytes as a few overlapping word moves when n is small (most field values are), so
+// that it costs no call; longer texts go to memcpy. Reads and writes stay inside the n bytes.
+inline void CopyBytes(char* to, const char* from, std::size_t n) {
+    if (n >= 16 && n <= 32) {
+        std::memcpy(to, from, 16);
+        std::memcpy(to + n - 16, from + n - 16, 16);
+    } else if (n >= 8 && n < 16) {
+        std::memcpy(to, from, 8);
+        std::memcpy(to + n - 8, from + n - 8, 8);
+    } else if (n >= 4 && n < 8) {
+        std::memcpy(to, from, 4);
+        std::memcpy(to + n - 4, from + n - 4, 4);
+    } else if (n < 4) {
+        for (std::size_t i = 0; i < n; ++i) to[i] = from[i];
+    } else {
+        std::memcpy(to, from, n);
+    }
+}
+
 unsigned short ClampedLength(const char* text) {
     size_t n = std::strlen(text);
     return n > OEString::kMaxLength ? static_cast<unsigned short>(OEString::kMaxLength)
@@ -110,7 +129,7 @@ unsigned short OEString::Assign(const char* text, unsigned short length) {
 unsigned short OEString::CopyText(const char* text, unsigned short length) {
     const unsigned short size = static_cast<unsigned short>(length + 1);
     if (size > m_bufferSize && !GrowBuffer(size, false)) return 0;
-    std::memcpy(m_buffer, text, length);
+    CopyBytes(m_buffer, text, length);
     m_buffer[length] = 0;
     m_length = length;
     return 1;
