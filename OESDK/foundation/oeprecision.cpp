@@ -84,9 +84,6 @@ const OEPrecisionInteger OEPrecisionInteger::OEPITenPentillion("1000000000000000
         (obj).m_hi = static_cast<std::uint32_t>(v_ >> 64);                                                   \
     } while (0)
 
-OEPrecisionInteger::OEPrecisionInteger()
-    : m_lo(0), m_mid(0), m_hi(0), m_sign(1), m_scale(0), m_text(nullptr), m_binary(nullptr), m_binaryLen(0) {}
-
 OEPrecisionInteger::OEPrecisionInteger(std::int32_t value, unsigned short scale) : OEPrecisionInteger() {
     m_lo = value < 0 ? 0u - static_cast<std::uint32_t>(value) : static_cast<std::uint32_t>(value);
     m_sign = value < 0 ? -1 : 1;
@@ -146,7 +143,44 @@ OEPrecisionInteger& OEPrecisionInteger::operator=(const OEPrecisionInteger& othe
     return *this;
 }
 
+// The common shape [+|-]digits[.digits], with ',' among the integer digits and at most 19
+// digits in all, is read in one pass without measuring the text first; it cannot fail. Any other
+// text, the empty one included, goes to ParseText, which also says what is wrong with it.
 unsigned short OEPrecisionInteger::ConvertStringToOEPrecisionInteger(const char* text) {
+    if (text) {
+        const char* p = text;
+        short sign = 1;
+        if (*p == '-' || *p == '+') sign = *p++ == '-' ? -1 : 1;
+        std::uint64_t mag = 0; // wraps harmlessly past 19 digits: such a text goes the long way
+        unsigned digits = 0;
+        for (;; ++p) {
+            const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+            if (d <= 9) {
+                mag = mag * 10 + d;
+                ++digits;
+            } else if (*p != ',') {
+                break;
+            }
+        }
+        unsigned scale = 0;
+        if (*p == '.') {
+            for (++p;; ++p) {
+                const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+                if (d > 9) break;
+                mag = mag * 10 + d;
+                ++scale;
+            }
+        }
+        digits += scale;
+        if (*p == 0 && digits != 0 && digits <= 19) {
+            m_lo = static_cast<std::uint32_t>(mag);
+            m_mid = static_cast<std::uint32_t>(mag >> 32);
+            m_hi = 0;
+            m_sign = sign;
+            m_scale = static_cast<unsigned short>(scale);
+            return 1;
+        }
+    }
     if (!text) {
         m_lo = m_mid = m_hi = 0;
         m_sign = 1;
