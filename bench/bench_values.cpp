@@ -60,6 +60,31 @@ void BM_DateTimeCompare(benchmark::State& state) {
 }
 BENCHMARK(BM_DateTimeCompare);
 
+// Text to value alone, over the shapes a statement is made of (amounts, dates with and without a
+// time, with milliseconds and a zone): the path every parsed element takes.
+void BM_DecimalParse(benchmark::State& state) {
+    static const char* const kTexts[] = {"-1234.56", "0.01", "1,000,000.00", "4999"};
+    OEPrecisionInteger n;
+    std::size_t i = 0;
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(n.ConvertStringToOEPrecisionInteger(kTexts[i]));
+        i = (i + 1) & 3;
+    }
+}
+BENCHMARK(BM_DecimalParse);
+
+void BM_DateTimeParse(benchmark::State& state) {
+    static const char* const kTexts[] = {"20230312120000", "20240105", "20240105120000.000[-5:EST]",
+                                         "20231231235959.5"};
+    OEDateTime d;
+    std::size_t i = 0;
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(d.ConvertStringToOEDateTime(kTexts[i]));
+        i = (i + 1) & 3;
+    }
+}
+BENCHMARK(BM_DateTimeParse);
+
 void BM_KeywordLookup(benchmark::State& state) {
     OEBankTxType t = OEBTT_CREDIT;
     for (auto _ : state) {

@@ -316,6 +316,7 @@ struct OEDateTimeBase::CommonShape {
         year = static_cast<unsigned short>(century * 100 + yy);
         month = static_cast<unsigned short>(mm);
         day = static_cast<unsigned short>(dd);
+        if (dd >= 1 && dd <= 28) return true;
         const bool leap = year % 4 == 0 && (year % 100 != 0 || year % 400 == 0);
         return dd >= 1 && dd <= kDaysPerMonth[mm - 1] + (mm == 2 && leap ? 1u : 0u);
     }
@@ -405,17 +406,20 @@ struct OEDateTimeBase::CommonShape {
 };
 
 // A text that is the zone name's own buffer goes the general way: clearing the fields first
-// changes such a text, and the general reader is what defines the outcome.
+// changes such a text, and the general reader is what defines the outcome. (While the name is
+// empty its buffer holds no text that could pass for a common shape.)
 unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
     CommonShape shape;
-    if (text && text != m_tzName.c_str() && shape.ReadDate(text) && shape.ReadTime(text + 8))
+    if (text && (m_tzName.IsEmpty() || text != m_tzName.c_str()) && shape.ReadDate(text) &&
+        shape.ReadTime(text + 8))
         return shape.StoreInto(*this, text);
     return ParseDateTimeText(text);
 }
 
 unsigned short OEDateTimeBase::ConvertStringToOETime(const char* text) {
     CommonShape shape;
-    if (text && text != m_tzName.c_str() && shape.ReadTime(text)) return shape.StoreInto(*this, text);
+    if (text && (m_tzName.IsEmpty() || text != m_tzName.c_str()) && shape.ReadTime(text))
+        return shape.StoreInto(*this, text);
     return ParseTimeText(text);
 }
 
