@@ -109,6 +109,19 @@ void Warn(OEParseWarning code, const char* value, const char* context) {
     OELogParseWarning(code, value ? value : "", context);
 }
 
+// True when a North American zone name does not belong to its offset of -4 to -8 whole hours.
+bool ZoneNameMismatch(const char* name, short hours, short fraction) {
+    if (hours > -4 || hours < -8 || fraction != 0 || !*name) return false;
+    static const char kStandard[5][4] = {"AST", "EST", "CST", "MST", "PST"};
+    static const char kDaylight[5][4] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
+    // Character by character: a shorter name stops at its NUL, which no table name has.
+    const auto is = [name](const char* k) {
+        return name[0] == k[0] && name[1] == k[1] && name[2] == k[2] && name[3] == 0;
+    };
+    const int i = -hours - 4;
+    return !is(kStandard[i]) && !is(kDaylight[i]);
+}
+
 } // namespace
 
 OEDateTimeBase::OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
@@ -192,13 +205,7 @@ bool OEDateTimeBase::StoreTimeZone(const char* name, short hours, short fraction
     m_tzName.Assign(name, static_cast<unsigned short>(name ? std::strlen(name) : 0));
     m_tzHours = hours;
     m_tzFraction = fraction;
-    if (hours <= -4 && hours >= -8 && fraction == 0 && !m_tzName.IsEmpty()) {
-        static const char* const kStandard[5] = {"AST", "EST", "CST", "MST", "PST"};
-        static const char* const kDaylight[5] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
-        const int i = -hours - 4;
-        return m_tzName != kStandard[i] && m_tzName != kDaylight[i];
-    }
-    return false;
+    return ZoneNameMismatch(m_tzName.c_str(), hours, fraction);
 }
 
 void OEDateTimeBase::LogPending(unsigned pending, const char* whole) {
@@ -302,6 +309,7 @@ struct OEDateTimeBase::CommonShape {
     unsigned short hour = 0, minute = 0, second = 0, millisecond = 0;
     short tzHours = 0, tzFraction = 0;
     char name[4] = {0, 0, 0, 0};
+    unsigned short nameLength = 0;
     bool zone = false;
 
     // YYYYMMDD, a valid date.
@@ -369,10 +377,8 @@ struct OEDateTimeBase::CommonShape {
             else
                 f *= 10; // one digit counts as tenths of an hour
         }
-        if (*p == ':') {
-            int len = 0;
-            for (++p; len < 3 && *p && *p != ']'; ++p) name[len++] = *p;
-        }
+        if (*p == ':')
+            for (++p; nameLength < 3 && *p && *p != ']'; ++p) name[nameLength++] = *p;
         tzHours = static_cast<short>(sign * static_cast<int>(h));
         tzFraction = static_cast<short>(sign * static_cast<int>(f));
         return p[0] == ']' && p[1] == 0;
@@ -380,19 +386,14 @@ struct OEDateTimeBase::CommonShape {
 
     // Stores the fields read exactly as the general reader would have stored them.
     unsigned short StoreInto(OEDateTimeBase& d, const char* whole) const {
-        bool mismatch = false;
-        if (zone) {
-            mismatch = d.StoreTimeZone(name, tzHours, tzFraction);
-            if (name[0] && d.m_tzName.IsEmpty()) {
-                // No memory for the name: the general reader fails here, the other fields cleared.
-                d.m_year = d.m_month = d.m_day = d.m_hour = d.m_minute = d.m_second = d.m_millisecond = 0;
-                Warn(OEPW_NULLPOINTER, whole, kCtxTime);
-                return 0;
-            }
-        } else {
-            d.m_tzHours = d.m_tzFraction = 0;
-            if (!d.m_tzName.IsEmpty()) d.m_tzName.Truncate(0);
-        }
+        if (zone) return StoreWithZone(d, whole);
+        d.m_tzHours = d.m_tzFraction = 0;
+        if (!d.m_tzName.IsEmpty()) d.m_tzName.Truncate(0);
+        StoreDateAndTime(d);
+        return 1;
+    }
+
+    void StoreDateAndTime(OEDateTimeBase& d) const {
         d.m_year = year;
         d.m_month = month;
         d.m_day = day;
@@ -400,7 +401,22 @@ struct OEDateTimeBase::CommonShape {
         d.m_minute = minute;
         d.m_second = second;
         d.m_millisecond = millisecond;
-        if (mismatch) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
+    }
+
+    // As StoreTimeZone, with the name's length known already. Out of line: most texts have no
+    // zone, and their reading stays lean.
+    __attribute__((noinline)) unsigned short StoreWithZone(OEDateTimeBase& d, const char* whole) const {
+        d.m_tzName.Assign(name, nameLength);
+        d.m_tzHours = tzHours;
+        d.m_tzFraction = tzFraction;
+        if (nameLength && d.m_tzName.IsEmpty()) {
+            // No memory for the name: the general reader fails here, the other fields cleared.
+            d.m_year = d.m_month = d.m_day = d.m_hour = d.m_minute = d.m_second = d.m_millisecond = 0;
+            Warn(OEPW_NULLPOINTER, whole, kCtxTime);
+            return 0;
+        }
+        StoreDateAndTime(d);
+        if (ZoneNameMismatch(name, tzHours, tzFraction)) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
         return 1;
     }
 };

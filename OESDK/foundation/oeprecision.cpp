@@ -48,6 +48,18 @@ int Digits32(std::uint32_t v, char* out) {
     return n;
 }
 
+// The digits of [begin, end), other characters skipped, as one number: the magnitudes too wide
+// for 64 bits (at most 28 digits, so below 2^96). Kept out of line to leave the common reading
+// lean.
+__attribute__((noinline)) U128 WideDigits(const char* begin, const char* end) {
+    U128 mag = 0;
+    for (const char* p = begin; p < end; ++p) {
+        const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+        if (d <= 9) mag = mag * 10 + d;
+    }
+    return mag;
+}
+
 void Warn(OEParseWarning code, const char* text) {
     OELogParseWarning(code, text ? text : "", "");
 }
@@ -143,15 +155,16 @@ OEPrecisionInteger& OEPrecisionInteger::operator=(const OEPrecisionInteger& othe
     return *this;
 }
 
-// The common shape [+|-]digits[.digits], with ',' among the integer digits and at most 19
-// digits in all, is read in one pass without measuring the text first; it cannot fail. Any other
-// text, the empty one included, goes to ParseText, which also says what is wrong with it.
+// The common shape [+|-]digits[.digits], with ',' among the integer digits and at most 28
+// digits in all, is read without measuring the text first (in one pass up to 19 digits); it
+// cannot fail. Any other text, the empty one included, goes to ParseText, which also says what
+// is wrong with it.
 unsigned short OEPrecisionInteger::ConvertStringToOEPrecisionInteger(const char* text) {
     if (text) {
         const char* p = text;
         short sign = 1;
         if (*p == '-' || *p == '+') sign = *p++ == '-' ? -1 : 1;
-        std::uint64_t mag = 0; // wraps harmlessly past 19 digits: such a text goes the long way
+        std::uint64_t mag = 0; // wraps harmlessly past 19 digits: such a text is read again
         unsigned digits = 0;
         for (;; ++p) {
             const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
@@ -172,12 +185,16 @@ unsigned short OEPrecisionInteger::ConvertStringToOEPrecisionInteger(const char*
             }
         }
         digits += scale;
-        if (*p == 0 && digits != 0 && digits <= 19) {
+        if (*p == 0 && digits != 0 && digits < kMaxDigits) {
+            m_sign = sign;
+            m_scale = static_cast<unsigned short>(scale);
+            if (digits > 19) {
+                OE_SETMAG(*this, WideDigits(text, p));
+                return 1;
+            }
             m_lo = static_cast<std::uint32_t>(mag);
             m_mid = static_cast<std::uint32_t>(mag >> 32);
             m_hi = 0;
-            m_sign = sign;
-            m_scale = static_cast<unsigned short>(scale);
             return 1;
         }
     }
