@@ -22,7 +22,7 @@ struct GeneralDecimal : OEPrecisionInteger {
     unsigned short Parse(const char* text) { return ParseText(text, text + std::strlen(text), text); }
 };
 
-// Everything a caller can see after a conversion, as one comparable text.
+// The warnings logged since the last look, as text.
 std::string Warnings(ScopedWarningLog& log) {
     std::ostringstream out;
     for (const RecordedWarning& w : log.Entries())
@@ -31,6 +31,7 @@ std::string Warnings(ScopedWarningLog& log) {
     return out.str();
 }
 
+// Everything a caller can see after a conversion, as one comparable text.
 std::string Observe(unsigned short result, const OEDateTimeBase& d, ScopedWarningLog& log) {
     std::ostringstream out;
     out << result << " | " << d.GetYear() << '-' << d.GetMonth() << '-' << d.GetDay() << ' ' << d.GetHour()
@@ -48,7 +49,7 @@ std::string Observe(unsigned short result, const OEPrecisionInteger& n, ScopedWa
     return out.str();
 }
 
-// Texts built from pieces, then the same texts with single characters replaced or cut short.
+// Every text made of one choice from each part, in order.
 std::vector<std::string> Combine(const std::vector<std::vector<std::string>>& parts) {
     std::vector<std::string> out{""};
     for (const auto& choices : parts) {
@@ -60,6 +61,7 @@ std::vector<std::string> Combine(const std::vector<std::vector<std::string>>& pa
     return out;
 }
 
+// Adds `count` of the texts again, each with one character replaced or cut short there.
 void AddMutations(std::vector<std::string>& texts, const char* alphabet, unsigned count) {
     std::mt19937 rng(20240229);
     const std::size_t base = texts.size();
