@@ -5,6 +5,7 @@
 #include "values_testlog.h"
 
 #include <cstring>
+#include <memory>
 #include <random>
 #include <sstream>
 #include <string>
@@ -78,6 +79,13 @@ void AddMutations(std::vector<std::string>& texts, const char* alphabet, unsigne
     }
 }
 
+// The text in a block of exactly its size, so that a sanitizer sees any read past its end.
+std::unique_ptr<char[]> Exact(const std::string& text) {
+    std::unique_ptr<char[]> copy(new char[text.size() + 1]);
+    std::memcpy(copy.get(), text.c_str(), text.size() + 1);
+    return copy;
+}
+
 const char* const kEarlier = "19991231235959.999[-5:EST]";
 
 class ValuesShortcut : public ::testing::Test {
@@ -108,8 +116,11 @@ TEST_F(ValuesShortcut, DateTimesMatchTheGeneralReader) {
         texts.push_back(more);
     AddMutations(texts, "0123456789.[]:+-E x", 4000);
 
-    for (const std::string& text : texts) {
-        SCOPED_TRACE("\"" + text + "\"");
+    for (const std::string& each : texts) {
+        SCOPED_TRACE("\"" + each + "\"");
+        const std::unique_ptr<char[]> exact = Exact(each);
+        const char* const text = exact.get();
+        const char* const time = text + (each.size() >= 8 ? 8 : 0);
         for (bool fresh : {true, false}) {
             OEDateTime shortcut;
             GeneralDateTime general;
@@ -118,18 +129,15 @@ TEST_F(ValuesShortcut, DateTimesMatchTheGeneralReader) {
                 general.Parse(kEarlier);
             }
             log.Clear();
-            const std::string viaShortcut =
-                Observe(shortcut.ConvertStringToOEDateTime(text.c_str()), shortcut, log);
-            const std::string viaGeneral = Observe(general.Parse(text.c_str()), general, log);
+            const std::string viaShortcut = Observe(shortcut.ConvertStringToOEDateTime(text), shortcut, log);
+            const std::string viaGeneral = Observe(general.Parse(text), general, log);
             ASSERT_EQ(viaGeneral, viaShortcut);
         }
         // A text that is a time alone.
         OETime shortcut;
         GeneralDateTime general;
-        const std::string viaShortcut =
-            Observe(shortcut.ConvertStringToOETime(text.c_str() + (text.size() >= 8 ? 8 : 0)), shortcut, log);
-        const std::string viaGeneral =
-            Observe(general.ParseTime(text.c_str() + (text.size() >= 8 ? 8 : 0)), general, log);
+        const std::string viaShortcut = Observe(shortcut.ConvertStringToOETime(time), shortcut, log);
+        const std::string viaGeneral = Observe(general.ParseTime(time), general, log);
         ASSERT_EQ(viaGeneral, viaShortcut);
     }
 }
@@ -199,15 +207,17 @@ TEST_F(ValuesShortcut, DecimalsMatchTheGeneralReader) {
     });
     AddMutations(texts, "0123456789,.-+ x", 3000);
 
-    for (const std::string& text : texts) {
-        SCOPED_TRACE("\"" + text + "\"");
+    for (const std::string& each : texts) {
+        SCOPED_TRACE("\"" + each + "\"");
+        const std::unique_ptr<char[]> exact = Exact(each);
+        const char* const text = exact.get();
         OEPrecisionInteger shortcut("-987.654");
         GeneralDecimal general;
         general.Parse("-987.654");
         log.Clear();
         const std::string viaShortcut =
-            Observe(shortcut.ConvertStringToOEPrecisionInteger(text.c_str()), shortcut, log);
-        const std::string viaGeneral = Observe(general.Parse(text.c_str()), general, log);
+            Observe(shortcut.ConvertStringToOEPrecisionInteger(text), shortcut, log);
+        const std::string viaGeneral = Observe(general.Parse(text), general, log);
         ASSERT_EQ(viaGeneral, viaShortcut);
     }
 }
