@@ -450,6 +450,32 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
     return StoreText(row, bit, text);
 }
 
+namespace {
+
+// A second value for a field already present converts through a copy, so that a refused text
+// leaves the old value. Out of line: the common first value needs no temporary.
+#if defined(__GNUC__)
+#define OE_NOINLINE __attribute__((noinline))
+#else
+#define OE_NOINLINE
+#endif
+OE_NOINLINE bool ReplaceAmount(OEPrecisionInteger& field, const char* text) {
+    OEPrecisionInteger value;
+    if (!value.ConvertStringToOEPrecisionInteger(text) || !value.IsValid()) return false;
+    field = value;
+    return true;
+}
+
+OE_NOINLINE bool ReplaceDateTime(OEDateTime& field, const char* text) {
+    OEDateTime value;
+    if (!value.ConvertStringToOEDateTime(text)) return false;
+    field = value;
+    return true;
+}
+#undef OE_NOINLINE
+
+} // namespace
+
 unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
     const OETagID tag = row->m_tag;
     const unsigned short mark = static_cast<unsigned short>(bit);
@@ -472,10 +498,8 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
         OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
         if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
-        } else {
-            OEPrecisionInteger value;
-            if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
-            *field = value;
+        } else if (!ReplaceAmount(*field, s)) {
+            break;
         }
         SetPresentBit(mark);
         return 1;
@@ -484,10 +508,8 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
         OEDateTime* field = static_cast<OEDateTime*>(slot);
         if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEDateTime(s)) break;
-        } else {
-            OEDateTime value;
-            if (!value.ConvertStringToOEDateTime(s)) break;
-            *field = value;
+        } else if (!ReplaceDateTime(*field, s)) {
+            break;
         }
         SetPresentBit(mark);
         return 1;
