@@ -72,16 +72,10 @@ struct Slab {
     char* m_end;
 };
 
-const std::size_t kSlabBytes = 64 * 1024;
 const std::size_t kAlign = 16;
-const std::size_t kSlabHeader = (sizeof(Slab) + kAlign - 1) / kAlign * kAlign;
 
 inline Slab*& SlabOf(void* block) {
     return *reinterpret_cast<Slab**>(static_cast<char*>(block) - sizeof(Slab*));
-}
-
-inline char* SlabStart(Slab* slab) {
-    return reinterpret_cast<char*>(slab) + kSlabHeader;
 }
 
 void ReleaseSlab(Slab* slab) {
@@ -121,6 +115,13 @@ void* HeapBlock(std::size_t bytes) {
 }
 
 #if !defined(OESDK_POOL_DIRECT)
+const std::size_t kSlabBytes = 64 * 1024;
+const std::size_t kSlabHeader = (sizeof(Slab) + kAlign - 1) / kAlign * kAlign;
+
+inline char* SlabStart(Slab* slab) {
+    return reinterpret_cast<char*>(slab) + kSlabHeader;
+}
+
 // A fresh current slab for the thread (the old one is let go). Null when memory is short.
 Slab* NewCurrentSlab() {
     static thread_local CursorGuard guard;
