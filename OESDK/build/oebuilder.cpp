@@ -13,6 +13,7 @@
 #include <emmintrin.h>
 #endif
 #include <string>
+#include <typeinfo>
 #include <vector>
 
 const char OEBuilder::OE_NEW_LINE[] = "\n";
@@ -72,35 +73,53 @@ inline const char* FirstToEscape(const char* p, const char* end, bool xmlQuote) 
     return p;
 }
 
-// Every tag of the dictionary by id with the length of its name, looked up once for the process.
+// Every tag of the dictionary by id, looked up once for the process: the dictionary's name and
+// the whole end tag "</NAME>\n", whose tail also gives the start tag ("NAME>\n") and the element
+// tag ("NAME>") after a "<".
 struct TagName {
     const char* m_text; // null: no such tag
+    const char* m_end;  // "</NAME>\n"
     unsigned short m_length;
 };
 
-const std::vector<TagName>& MakeTagNames() {
-    static const std::vector<TagName> names = [] {
-        std::vector<TagName> table;
+struct TagNames {
+    std::vector<TagName> m_rows;
+    std::vector<char> m_texts;
+};
+
+const TagNames& MakeTagNames() {
+    static const TagNames names = [] {
+        TagNames t;
         OETagDictionary* d = OETagDictionary::TheOETagDictionary();
         unsigned n = NumberOfOEDictionaryEntry();
-        table.assign(n + 1, TagName{nullptr, 0});
+        t.m_rows.assign(n + 1, TagName{nullptr, nullptr, 0});
+        std::vector<std::size_t> at(n + 1, 0);
         for (unsigned id = 1; d && id <= n; ++id) {
             const char* name = d->GetTagString(static_cast<OETagID>(id));
             size_t length = name ? std::strlen(name) : 0;
-            if (length && length < 65535) table[id] = TagName{name, static_cast<unsigned short>(length)};
+            if (!length || length >= 65535 - 4) continue;
+            t.m_rows[id] = TagName{name, nullptr, static_cast<unsigned short>(length)};
+            at[id] = t.m_texts.size();
+            t.m_texts.push_back('<');
+            t.m_texts.push_back('/');
+            t.m_texts.insert(t.m_texts.end(), name, name + length);
+            t.m_texts.push_back('>');
+            t.m_texts.push_back('\n');
         }
-        return table;
+        for (unsigned id = 1; id <= n; ++id)
+            if (t.m_rows[id].m_text) t.m_rows[id].m_end = t.m_texts.data() + at[id];
+        return t;
     }();
     return names;
 }
 
 // Set by every builder's constructor (always the same table), then read without the guard of
 // the function-local static.
-std::atomic<const std::vector<TagName>*> g_tagNames{nullptr};
+std::atomic<const TagNames*> g_tagNames{nullptr};
 
-inline const std::vector<TagName>& TagNames() {
-    const std::vector<TagName>* names = g_tagNames.load(std::memory_order_relaxed);
-    return names ? *names : MakeTagNames();
+inline const std::vector<TagName>& TagRows() {
+    const TagNames* names = g_tagNames.load(std::memory_order_relaxed);
+    return (names ? *names : MakeTagNames()).m_rows;
 }
 
 // Room for `n` more bytes at the buffer's offset when the block already holds them (the case in
@@ -117,7 +136,17 @@ inline char* Room(OEBuffer* buffer, unsigned long n) {
 // overlapping word moves instead of a call.
 inline void CopyBytes(char* to, const char* from, std::size_t n) {
     std::uint64_t a, b;
-    if (n >= 8 && n <= 16) {
+    if (n > 16 && n <= 32) {
+        std::uint64_t c, d;
+        std::memcpy(&a, from, 8);
+        std::memcpy(&b, from + 8, 8);
+        std::memcpy(&c, from + n - 16, 8);
+        std::memcpy(&d, from + n - 8, 8);
+        std::memcpy(to, &a, 8);
+        std::memcpy(to + 8, &b, 8);
+        std::memcpy(to + n - 16, &c, 8);
+        std::memcpy(to + n - 8, &d, 8);
+    } else if (n >= 8 && n <= 16) {
         std::memcpy(&a, from, 8);
         std::memcpy(&b, from + n - 8, 8);
         std::memcpy(to, &a, 8);
@@ -170,16 +199,45 @@ void OEBuilder::Put(const char* text) {
     Put(text, std::strlen(text));
 }
 
+void OEBuilder::PutLine(const char* text, unsigned long length) {
+    // Text and line end in one copy when the block has room, as it usually has.
+    if (char* room = Room(m_buffer, length + 1)) {
+        CopyBytes(room, text, length);
+        room[length] = OE_NEW_LINE[0];
+        Commit(m_buffer, room + length + 1);
+        return;
+    }
+    Put(text, length);
+    Put(OE_NEW_LINE, 1);
+}
+
 const char* OEBuilder::TagText(OETagID tag) const {
-    const std::vector<TagName>& names = TagNames();
+    const std::vector<TagName>& names = TagRows();
     if (!m_dictionary || tag == 0 || tag >= names.size()) return nullptr;
     return names[tag].m_text;
 }
 
 OEBuildStatus OEBuilder::PutTag(OETagType type, OETagID tag) {
-    const std::vector<TagName>& names = TagNames();
+    const std::vector<TagName>& names = TagRows();
     if (!m_dictionary || tag == 0 || tag >= names.size() || !names[tag].m_text) return OEBS_BADARGUMENT;
-    return AddTag(type, names[tag].m_text, names[tag].m_length);
+    const TagName& name = names[tag];
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    // The tag's ready-made text in one copy: "</NAME>\n", or "<" and "NAME>\n" / "NAME>".
+    const unsigned long n = name.m_length;
+    if (char* p = Room(m_buffer, n + 4)) {
+        if (type == OETT_END) {
+            CopyBytes(p, name.m_end, n + 4);
+            p += n + 4;
+        } else {
+            const unsigned long tail = type == OETT_ELEMENT ? n + 1 : n + 2;
+            *p = '<';
+            CopyBytes(p + 1, name.m_end + 2, tail);
+            p += 1 + tail;
+        }
+        Commit(m_buffer, p);
+        return OEBS_OK;
+    }
+    return AddTag(type, name.m_text, n);
 }
 
 OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringOpt stringOpt,
@@ -367,15 +425,33 @@ OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt 
             }
             Put(text, n);
         } else {
-            std::string work(text, static_cast<size_t>(p - text));
-            for (; p < end; ++p) {
-                if (NeedsEscape(*p, xmlQuote))
-                    work += EntityFor(*p);
-                else
-                    work += *p;
+            // An entity is at most six characters, so a short text is escaped on the stack.
+            char small[512];
+            std::string large;
+            char* work = small;
+            if (length > (sizeof(small) - 1) / 6) {
+                large.resize(length * 6);
+                work = &large[0];
             }
-            if (truncate && work.size() > value.SpecLength()) work.resize(value.SpecLength());
-            Put(work.data(), work.size());
+            const size_t head = static_cast<size_t>(p - text);
+            std::memcpy(work, text, head);
+            char* w = work + head;
+            for (; p < end; ++p) {
+                if (const char* entity = NeedsEscape(*p, xmlQuote) ? EntityFor(*p) : nullptr) {
+                    const size_t e = std::strlen(entity);
+                    std::memcpy(w, entity, e);
+                    w += e;
+                } else {
+                    *w++ = *p;
+                }
+            }
+            size_t size = static_cast<size_t>(w - work);
+            if (truncate && size > value.SpecLength()) size = value.SpecLength();
+            if (crlf == OEBCL_NEWLINE) {
+                PutLine(work, size);
+                return OEBS_OK;
+            }
+            Put(work, size);
         }
     } else {
         Put(text, truncate ? value.SpecLength() : length);
@@ -387,10 +463,20 @@ OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt 
 OEBuildStatus OEBuilder::AddPrecisionInteger(const OEPrecisionInteger& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
     if (!value.IsValid()) return OEBS_NOTEXTFORM;
+    // The library's own number classes keep the base text form: it is written from the stack,
+    // without the number's text buffer. A class that may change the form (the payroll amount, a
+    // host's subclass) goes through its conversion operator. Comparing the type records' addresses
+    // may miss (a record duplicated across modules), never match wrongly.
+    const std::type_info* type = &typeid(value);
+    if (type == &typeid(OEPrecisionInteger) || type == &typeid(OEPosPrecisionInteger) ||
+        type == &typeid(OEPercent)) {
+        char digits[OEPrecisionInteger::kTextSize];
+        PutLine(digits, value.FormatText(digits));
+        return OEBS_OK;
+    }
     const char* text = static_cast<const char*>(const_cast<OEPrecisionInteger&>(value));
     if (!text) return OEThreadState::GetErrorCode() == OETE_OUTOFMEMORY ? OEBS_OUTOFMEMORY : OEBS_NOTEXTFORM;
-    Put(text);
-    Put("\n", 1);
+    PutLine(text, std::strlen(text));
     return OEBS_OK;
 }
 
@@ -409,11 +495,25 @@ OEBuildStatus OEBuilder::AddRate(OEPercent value) {
 
 OEBuildStatus OEBuilder::AddDateTime(const OEDateTime& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
+    // A plain OEDateTime has the base text form: formatted straight into the block (see the type
+    // test of AddPrecisionInteger); other classes through their own GetDateString.
+    if (&typeid(value) == &typeid(OEDateTime)) {
+        char* room = Room(m_buffer, OEDateTimeBase::kDateTextSize + 1);
+        char text[OEDateTimeBase::kDateTextSize];
+        const unsigned short n = value.FormatDate(room ? room : text);
+        if (!n) return OEBS_NOTEXTFORM;
+        if (!room) {
+            PutLine(text, n);
+            return OEBS_OK;
+        }
+        room[n] = OE_NEW_LINE[0];
+        Commit(m_buffer, room + n + 1);
+        return OEBS_OK;
+    }
     // One text per thread, kept between calls: a date costs no allocation once it has grown.
     static thread_local OEString text;
     if (!const_cast<OEDateTime&>(value).GetDateString(text)) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
+    PutLine(text.c_str(), text.GetStrLength());
     return OEBS_OK;
 }
 
@@ -429,8 +529,14 @@ OEBuildStatus OEBuilder::AddTime(const OETime& value) {
 OEBuildStatus OEBuilder::PutKeywordLine(unsigned short converted, const OEString& text) {
     if (!m_buffer) return OEBS_BADARGUMENT;
     if (!converted) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put(OE_NEW_LINE, 1);
+    PutLine(text.c_str(), text.GetStrLength());
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::PutKeyword(const OEKeywordTable& table, unsigned value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    if (value >= table.m_count || !table.m_words[value]) return OEBS_NOTEXTFORM;
+    PutLine(table.m_words[value], std::strlen(table.m_words[value]));
     return OEBS_OK;
 }
 
@@ -454,15 +560,22 @@ OEBuildStatus OEBuilder::AddKeywordString(unsigned short converted, const OEStri
         return PutKeywordLine(OEDataConversion::Stem##ToString(value, text), text);                          \
     }
 
-OE_KEYWORD_LINE_WRITER(AddBankTxType, OEBankTxType, BankTx)
-OE_KEYWORD_LINE_WRITER(AddBankAction, OEBankAction, BankAction)
+// The enumerations whose conversion is a plain look-up in one of the keyword tables (first value
+// 0): the keyword is taken from the table itself, the conversion's own result.
+#define OE_KEYWORD_TABLE_WRITER(Writer, Param, Table)                                                        \
+    OEBuildStatus OEBuilder::Writer(Param value) {                                                           \
+        return PutKeyword(Table, static_cast<unsigned>(value));                                              \
+    }
+
+OE_KEYWORD_TABLE_WRITER(AddBankTxType, OEBankTxType, OEKW_BANKTXTYPE)
+OE_KEYWORD_TABLE_WRITER(AddBankAction, OEBankAction, OEKW_CORRECTACTION)
 OE_KEYWORD_LINE_WRITER(AddProcCode, OEProcCode, ProcCode)
 OE_KEYWORD_LINE_WRITER(AddDayOfWeek, OEDayOfWeek, DayOfWeek)
-OE_KEYWORD_LINE_WRITER(AddClientRouting, OEClientRouting, ClientRouting)
-OE_KEYWORD_LINE_WRITER(AddOFXSecurity, OEOFXSecurity, OFXSecurity)
-OE_KEYWORD_LINE_WRITER(AddSyncMode, OESyncMode, SyncMode)
+OE_KEYWORD_TABLE_WRITER(AddClientRouting, OEClientRouting, OEKW_CLIENTROUTING)
+OE_KEYWORD_TABLE_WRITER(AddOFXSecurity, OEOFXSecurity, OEKW_OFXSECURITY)
+OE_KEYWORD_TABLE_WRITER(AddSyncMode, OESyncMode, OEKW_SYNCMODE)
 OE_KEYWORD_WRITER(AddCharacterType, OECharacterType, CharacterType, AddKeywordString)
-OE_KEYWORD_LINE_WRITER(AddBankAccountType, OEBankAccountType, BankAccount)
+OE_KEYWORD_TABLE_WRITER(AddBankAccountType, OEBankAccountType, OEKW_BANKACCOUNTTYPE)
 OE_KEYWORD_LINE_WRITER(AddService, OEService, Service)
 OE_KEYWORD_LINE_WRITER(AddService2, OEService2, Service2)
 OE_KEYWORD_LINE_WRITER(AddServiceStatus, OEServiceStatus, ServiceStatus)
@@ -499,6 +612,8 @@ OE_KEYWORD_WRITER(AddCouponFreq, const OECouponFreq&, CouponFreq, AddKeywordStri
 OE_KEYWORD_WRITER(AddPayeeIDScope, const OEPayeeIDScope&, PayeeIDScope, AddKeywordString)
 
 #undef OE_KEYWORD_WRITER
+#undef OE_KEYWORD_LINE_WRITER
+#undef OE_KEYWORD_TABLE_WRITER
 
 OEBuildStatus OEBuilder::AddServerID(const OEString36& value) {
     return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
@@ -656,8 +771,7 @@ OEBuildStatus OEBuilder::AddTagOEKeyword(OETagID tag, const char* keyword) {
     OEBuildStatus s = AddTagElement(tag);
     if (s != OEBS_OK) return s;
     // Keywords are the library's own constant texts: nothing to escape, no bound to check.
-    Put(keyword);
-    Put(OE_NEW_LINE, 1);
+    PutLine(keyword, std::strlen(keyword));
     return FinishElement(tag, OEBS_OK);
 }
 
