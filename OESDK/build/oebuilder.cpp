@@ -74,11 +74,15 @@ inline const char* FirstToEscape(const char* p, const char* end, bool xmlQuote) 
 }
 
 // Every tag of the dictionary by id, looked up once for the process: the dictionary's name and
-// the whole end tag "</NAME>\n", whose tail also gives the start tag ("NAME>\n") and the element
-// tag ("NAME>") after a "<".
+// the ready-made texts "<NAME>\n" (whose first n + 2 bytes are the element tag) and "</NAME>\n".
+// The texts lie in one block followed by kTagSlack spare bytes, so that a tag can be copied as
+// a fixed kTagSlack bytes whatever its length.
+enum : unsigned { kTagSlack = 32 };
+
 struct TagName {
-    const char* m_text; // null: no such tag
-    const char* m_end;  // "</NAME>\n"
+    const char* m_text;  // null: no such tag
+    const char* m_start; // "<NAME>\n"
+    const char* m_end;   // "</NAME>\n"
     unsigned short m_length;
 };
 
@@ -92,22 +96,28 @@ const TagNames& MakeTagNames() {
         TagNames t;
         OETagDictionary* d = OETagDictionary::TheOETagDictionary();
         unsigned n = NumberOfOEDictionaryEntry();
-        t.m_rows.assign(n + 1, TagName{nullptr, nullptr, 0});
+        t.m_rows.assign(n + 1, TagName{nullptr, nullptr, nullptr, 0});
         std::vector<std::size_t> at(n + 1, 0);
         for (unsigned id = 1; d && id <= n; ++id) {
             const char* name = d->GetTagString(static_cast<OETagID>(id));
             size_t length = name ? std::strlen(name) : 0;
             if (!length || length >= 65535 - 4) continue;
-            t.m_rows[id] = TagName{name, nullptr, static_cast<unsigned short>(length)};
+            t.m_rows[id] = TagName{name, nullptr, nullptr, static_cast<unsigned short>(length)};
             at[id] = t.m_texts.size();
-            t.m_texts.push_back('<');
-            t.m_texts.push_back('/');
-            t.m_texts.insert(t.m_texts.end(), name, name + length);
-            t.m_texts.push_back('>');
-            t.m_texts.push_back('\n');
+            for (const char* open : {"<", "</"}) {
+                t.m_texts.insert(t.m_texts.end(), open, open + std::strlen(open));
+                t.m_texts.insert(t.m_texts.end(), name, name + length);
+                t.m_texts.push_back('>');
+                t.m_texts.push_back('\n');
+            }
         }
-        for (unsigned id = 1; id <= n; ++id)
-            if (t.m_rows[id].m_text) t.m_rows[id].m_end = t.m_texts.data() + at[id];
+        t.m_texts.resize(t.m_texts.size() + kTagSlack, '\0');
+        for (unsigned id = 1; id <= n; ++id) {
+            TagName& row = t.m_rows[id];
+            if (!row.m_text) continue;
+            row.m_start = t.m_texts.data() + at[id];
+            row.m_end = row.m_start + row.m_length + 3;
+        }
         return t;
     }();
     return names;
@@ -171,6 +181,20 @@ inline void Commit(OEBuffer* buffer, const char* end) {
     buffer->SetBufferSize(at);
 }
 
+// Writes a dictionary tag whose block has room for a fixed-size copy; false (nothing written) when
+// the tag has no name or the block is short: the caller then takes PutTag's general path.
+inline bool FastTag(OEBuffer* buffer, OETagID tag, OETagType type) {
+    const std::vector<TagName>& names = TagRows();
+    if (tag >= names.size()) return false;
+    const TagName& name = names[tag];
+    char* p;
+    if (!name.m_text || name.m_length > kTagSlack - 4 || !(p = Room(buffer, kTagSlack))) return false;
+    std::memcpy(p, type == OETT_END ? name.m_end : name.m_start, kTagSlack);
+    const unsigned n = name.m_length;
+    Commit(buffer, p + (type == OETT_END ? n + 4 : type == OETT_ELEMENT ? n + 2 : n + 3));
+    return true;
+}
+
 } // namespace
 
 OEBuilder::OEBuilder(OEBuildStringCrLfOpt crlf, unsigned short elemEndTags)
@@ -220,24 +244,9 @@ const char* OEBuilder::TagText(OETagID tag) const {
 OEBuildStatus OEBuilder::PutTag(OETagType type, OETagID tag) {
     const std::vector<TagName>& names = TagRows();
     if (!m_dictionary || tag == 0 || tag >= names.size() || !names[tag].m_text) return OEBS_BADARGUMENT;
-    const TagName& name = names[tag];
     if (!m_buffer) return OEBS_BADARGUMENT;
-    // The tag's ready-made text in one copy: "</NAME>\n", or "<" and "NAME>\n" / "NAME>".
-    const unsigned long n = name.m_length;
-    if (char* p = Room(m_buffer, n + 4)) {
-        if (type == OETT_END) {
-            CopyBytes(p, name.m_end, n + 4);
-            p += n + 4;
-        } else {
-            const unsigned long tail = type == OETT_ELEMENT ? n + 1 : n + 2;
-            *p = '<';
-            CopyBytes(p + 1, name.m_end + 2, tail);
-            p += 1 + tail;
-        }
-        Commit(m_buffer, p);
-        return OEBS_OK;
-    }
-    return AddTag(type, name.m_text, n);
+    if (FastTag(m_buffer, tag, type)) return OEBS_OK;
+    return AddTag(type, names[tag].m_text, names[tag].m_length);
 }
 
 OEBuildStatus OEBuilder::Build(OEBuffer* buffer, OEDataObj* root, OEBuildStringOpt stringOpt,
@@ -300,15 +309,19 @@ OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name, size_t n) {
     return OEBS_OK;
 }
 
+// The usual case inline; PutTag has every other.
 OEBuildStatus OEBuilder::AddTagStart(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_START)) return OEBS_OK;
     return PutTag(OETT_START, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagEnd(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_END)) return OEBS_OK;
     return PutTag(OETT_END, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagElement(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_ELEMENT)) return OEBS_OK;
     return PutTag(OETT_ELEMENT, tag);
 }
 

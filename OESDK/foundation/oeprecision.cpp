@@ -41,6 +41,16 @@ const char kPairs[] = "000102030405060708091011121314151617181920212223242526272
                       "40414243444546474849505152535455565758596061626364656667686970717273747576777879"
                       "8081828384858687888990919293949596979899";
 
+// The number of decimal digits of v (1 for 0).
+unsigned DigitCount(std::uint64_t v) {
+    unsigned n = 1;
+    for (; v >= 10000; v /= 10000) n += 4;
+    if (v >= 10) ++n;
+    if (v >= 100) ++n;
+    if (v >= 1000) ++n;
+    return n;
+}
+
 // Writes the decimal digits of v (no leading zeros, "0" for 0); returns the count.
 int Digits64(std::uint64_t v, char* out) {
     char tmp[20];
@@ -432,14 +442,38 @@ unsigned short OEPrecisionInteger::FormatText(char* out) const {
         return 1;
     }
     if (m_sign == -1) *p++ = '-';
+    if (m_hi == 0 && m_mid == 0 && m_lo == 0) {
+        *p++ = '0';
+        *p = '\0';
+        return static_cast<unsigned short>(p - out);
+    }
+    if (m_hi == 0) {
+        // Up to 64 bits: trailing zeros of the fraction dropped first (the text never ends in
+        // a zero after the point, nor in the point), then the digits written from the right.
+        std::uint64_t v = (static_cast<std::uint64_t>(m_mid) << 32) | m_lo;
+        unsigned scale = m_scale;
+        while (scale > 0 && v % 10 == 0) {
+            v /= 10;
+            --scale;
+        }
+        const unsigned n = DigitCount(v);
+        // ".005" has no integer part: the fraction's missing leading digits are zeros.
+        const unsigned length = (n > scale ? n : scale) + (scale ? 1 : 0);
+        char* q = p + length;
+        *q = '\0';
+        for (unsigned i = 0; i < scale; ++i, v /= 10) *--q = static_cast<char>('0' + v % 10);
+        if (scale) *--q = '.';
+        while (v >= 10) {
+            q -= 2;
+            std::memcpy(q, kPairs + 2 * (v % 100), 2);
+            v /= 100;
+        }
+        if (v) *--q = static_cast<char>('0' + v);
+        return static_cast<unsigned short>(p + length - out);
+    }
     char digits[kMaxDigits + 1];
     int n;
     if (m_hi == 0 && m_mid == 0) {
-        if (m_lo == 0) {
-            *p++ = '0';
-            *p = '\0';
-            return static_cast<unsigned short>(p - out);
-        }
         n = Digits64(m_lo, digits);
     } else {
         // Above 64 bits: the digits below 10^19 are the remainder, written with leading zeros.
