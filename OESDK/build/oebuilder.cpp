@@ -58,15 +58,29 @@ inline bool NeedsEscape(char c, bool xmlQuote) {
 // The first character of [p, end) to write as an entity reference, or end.
 inline const char* FirstToEscape(const char* p, const char* end, bool xmlQuote) {
 #if defined(__SSE2__)
+    // Sixteen bytes at a time; the last block, or a text of 8 to 15 bytes read as two halves,
+    // overlaps bytes already found clean, so that no byte outside [p, end) is ever read.
     const __m128i lt = _mm_set1_epi8('<'), gt = _mm_set1_epi8('>'), amp = _mm_set1_epi8('&');
     const __m128i dq = _mm_set1_epi8(xmlQuote ? '"' : '<'), sq = _mm_set1_epi8(xmlQuote ? '\'' : '<');
-    for (; end - p >= 16; p += 16) {
-        const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+    auto hits = [&](__m128i v) {
         __m128i hit = _mm_or_si128(_mm_cmpeq_epi8(v, lt), _mm_cmpeq_epi8(v, gt));
         hit = _mm_or_si128(hit, _mm_cmpeq_epi8(v, amp));
         hit = _mm_or_si128(hit, _mm_or_si128(_mm_cmpeq_epi8(v, dq), _mm_cmpeq_epi8(v, sq)));
-        const unsigned mask = static_cast<unsigned>(_mm_movemask_epi8(hit));
-        if (mask) return p + __builtin_ctz(mask);
+        return static_cast<unsigned>(_mm_movemask_epi8(hit));
+    };
+    if (end - p >= 16) {
+        for (; end - p > 16; p += 16)
+            if (const unsigned mask = hits(_mm_loadu_si128(reinterpret_cast<const __m128i*>(p))))
+                return p + __builtin_ctz(mask);
+        const unsigned mask = hits(_mm_loadu_si128(reinterpret_cast<const __m128i*>(end - 16)));
+        return mask ? end - 16 + __builtin_ctz(mask) : end;
+    }
+    if (end - p >= 8) {
+        const __m128i low = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(p));
+        const __m128i high = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(end - 8));
+        const unsigned mask = hits(_mm_unpacklo_epi64(low, high));
+        if (mask & 0xFFu) return p + __builtin_ctz(mask);
+        return mask ? end - 8 + __builtin_ctz(mask >> 8) : end;
     }
 #endif
     while (p < end && !NeedsEscape(*p, xmlQuote)) ++p;
@@ -642,11 +656,6 @@ OEBuildStatus OEBuilder::AddLanguage(const OELanguage& value) {
     return AddString(code, OEBSM_MACROS, OEBCL_NEWLINE);
 }
 
-OEBuildStatus OEBuilder::FinishElement(OETagID tag, OEBuildStatus valueStatus) {
-    if (valueStatus == OEBS_OK && m_elemEndTags == 1) return AddTagElementEnd(tag);
-    return valueStatus;
-}
-
 OEBuildStatus OEBuilder::AddTagOEServerID(OETagID tag, const OEString36& value) {
     if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
     OEBuildStatus s = AddTagElement(tag);
@@ -695,7 +704,10 @@ OEBuildStatus OEBuilder::AddTagOESLong(OETagID tag, long value) {
 }
 
 OEBuildStatus OEBuilder::AddTagOEString(OETagID tag, const OEString& value) {
-    if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
+    // A text that starts with a character other than white space is not blank: no scan needed.
+    const char first = value.GetStrLength() ? value.c_str()[0] : ' ';
+    const bool maybeBlank = first == ' ' || first == '\n' || first == '\r' || first == '\t';
+    if (maybeBlank && value.IsWhiteSpace()) return OEBS_BLANKVALUE;
     OEBuildStatus s = AddTagElement(tag);
     return s != OEBS_OK ? s : FinishElement(tag, AddString(value, OEBSM_MACROS, OEBCL_NEWLINE));
 }

@@ -235,7 +235,10 @@ protected:
     void Put(const char* text);
     // Appends `length` bytes and OE_NEW_LINE, in one copy when the block has room.
     void PutLine(const char* text, unsigned long length);
-    OEBuildStatus FinishElement(OETagID tag, OEBuildStatus valueStatus);
+    // The end tag of an element whose value was written, in the XML-like form.
+    OEBuildStatus FinishElement(OETagID tag, OEBuildStatus valueStatus) {
+        return valueStatus == OEBS_OK && m_elemEndTags == 1 ? AddTagElementEnd(tag) : valueStatus;
+    }
     // The two ways a keyword is written: `converted` is the conversion's result, `text` its output.
     OEBuildStatus PutKeywordLine(unsigned short converted, const OEString& text);
     OEBuildStatus AddKeywordString(unsigned short converted, const OEString& text);
