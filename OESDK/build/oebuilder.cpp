@@ -497,6 +497,12 @@ OEBuildStatus OEBuilder::AddPrecisionInteger(const OEPrecisionInteger& value) {
     const std::type_info* type = &typeid(value);
     if (type == &typeid(OEPrecisionInteger) || type == &typeid(OEPosPrecisionInteger) ||
         type == &typeid(OEPercent)) {
+        if (char* room = Room(m_buffer, OEPrecisionInteger::kTextSize + 1)) {
+            const unsigned short n = value.FormatText(room);
+            room[n] = OE_NEW_LINE[0];
+            Commit(m_buffer, room + n + 1);
+            return OEBS_OK;
+        }
         char digits[OEPrecisionInteger::kTextSize];
         PutLine(digits, value.FormatText(digits));
         return OEBS_OK;
