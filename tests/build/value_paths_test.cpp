@@ -6,6 +6,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <string>
 
 namespace {
@@ -28,46 +29,48 @@ public:
     unsigned short GetDateString(OEString& out) const override { return out.Assign("STAMP", 5); }
 };
 
-TEST(BuilderValuePaths, NumbersOfEveryClassKeepTheirTextForm) {
-    Bound b;
+TEST(BuilderValuePaths, NumbersAndDatesOfEveryClassKeepTheirTextForm) {
     OEPrecisionInteger amount("-1234.500");
     OEPosPrecisionInteger price("0.0625");
-    OEPercent rate("12.50");
+    OEPercent rate("12.50"), tooMuch("100.01");
     Bracketed host("77.10");
     OEPayrollAmount empty(OEPAT_EMPTY), money("$12.5");
     // Above 64 bits: 1234567890123456789 x 1000003 with scale 4.
     const OEPrecisionInteger wide =
         OEPrecisionInteger(1234567890123456789ull, 0) * OEPrecisionInteger(1000003ull, 4);
-    EXPECT_EQ(b.builder.AddAmount(amount), OEBS_OK);
-    EXPECT_EQ(b.builder.AddUnitPrice(price), OEBS_OK);
-    EXPECT_EQ(b.builder.AddRate(rate), OEBS_OK);
-    EXPECT_EQ(b.builder.AddQuantity(host), OEBS_OK);
-    EXPECT_EQ(b.builder.AddAmount(empty), OEBS_OK);
-    EXPECT_EQ(b.builder.AddAmount(money), OEBS_OK);
-    EXPECT_EQ(b.builder.AddAmount(wide), OEBS_OK);
-    std::string expected = std::string("-1234.5\n.0625\n12.5\n#7.1\n") + static_cast<char*>(empty) + "\n" +
-                           static_cast<char*>(money) + "\n123457159382712715937.0367\n";
-    EXPECT_EQ(b.text(), expected);
-    OEPercent tooMuch("100.01");
-    EXPECT_EQ(b.builder.AddRate(tooMuch), OEBS_NOTEXTFORM);
-    EXPECT_EQ(b.text(), expected) << "an invalid number writes nothing";
-}
-
-TEST(BuilderValuePaths, DatesOfEveryClassKeepTheirTextForm) {
-    Bound b;
     OEDateTime plain("20240131235959.999[-3.5:NST]"), midnight("20240229");
     OEDateTime invalid(2023, 2, 29, 0, 0, 0, 0, 0, 0);
-    Stamped host("20240101");
+    Stamped stamped("20240101");
     OEPayrollDateTime payrollEmpty, payroll;
     payrollEmpty.Assign("^@~*");
     payroll.Assign("20240102");
-    EXPECT_EQ(b.builder.AddDateTime(plain), OEBS_OK);
-    EXPECT_EQ(b.builder.AddDateTime(midnight), OEBS_OK);
-    EXPECT_EQ(b.builder.AddDateTime(invalid), OEBS_NOTEXTFORM);
-    EXPECT_EQ(b.builder.AddDateTime(host), OEBS_OK);
-    EXPECT_EQ(b.builder.AddDateTime(payrollEmpty), OEBS_OK);
-    EXPECT_EQ(b.builder.AddDateTime(payroll), OEBS_OK);
-    EXPECT_EQ(b.text(), "20240131235959.999[-3.50:NST]\n20240229\nSTAMP\n^@~*\n20240102\n");
+    const struct {
+        std::function<int(OEBuilder&)> write;
+        int status;
+        std::string text; // written, with its line end
+    } cases[] = {
+        {[&](OEBuilder& b) { return b.AddAmount(amount); }, OEBS_OK, "-1234.5\n"},
+        {[&](OEBuilder& b) { return b.AddUnitPrice(price); }, OEBS_OK, ".0625\n"},
+        {[&](OEBuilder& b) { return b.AddRate(rate); }, OEBS_OK, "12.5\n"},
+        {[&](OEBuilder& b) { return b.AddRate(tooMuch); }, OEBS_NOTEXTFORM, ""},
+        {[&](OEBuilder& b) { return b.AddQuantity(host); }, OEBS_OK, "#7.1\n"},
+        {[&](OEBuilder& b) { return b.AddAmount(empty); }, OEBS_OK,
+         std::string(static_cast<char*>(empty)) + "\n"},
+        {[&](OEBuilder& b) { return b.AddAmount(money); }, OEBS_OK,
+         std::string(static_cast<char*>(money)) + "\n"},
+        {[&](OEBuilder& b) { return b.AddAmount(wide); }, OEBS_OK, "123457159382712715937.0367\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(plain); }, OEBS_OK, "20240131235959.999[-3.50:NST]\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(midnight); }, OEBS_OK, "20240229\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(invalid); }, OEBS_NOTEXTFORM, ""},
+        {[&](OEBuilder& b) { return b.AddDateTime(stamped); }, OEBS_OK, "STAMP\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(payrollEmpty); }, OEBS_OK, "^@~*\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(payroll); }, OEBS_OK, "20240102\n"},
+    };
+    for (const auto& c : cases) {
+        Bound b;
+        EXPECT_EQ(c.write(b.builder), c.status) << c.text;
+        EXPECT_EQ(b.text(), c.text);
+    }
 }
 
 // The same elements written into blocks from empty to roomy, growing one byte at a time or in
