@@ -707,29 +707,15 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
     return BuildRowWith(builder, row, EnumWriterFor(row->m_keywords));
 }
 
-OEBuildStatus OEAggregate::BuildRowWith(OEBuilder* builder, const OEFieldRow* row, OEEnumWriter write) {
-    OETagID tag = row->m_tag;
-    void* slot = Slot(row);
+namespace {
+
+// Writes an element row (any kind but a child or a list) whose value is at `slot`; the caller
+// records the failure. Kept apart from the child rows, which recurse, so that the common case
+// saves and restores little.
+OEBuildStatus WriteElementRow(OEBuilder* builder, const OEFieldRow* row, const void* slot,
+                              OEEnumWriter write) {
+    const OETagID tag = row->m_tag;
     OEBuildStatus status = OEBS_OK;
-    switch (row->m_kind) {
-    case OEFK_CHILD: {
-        OEDataObj* child = *static_cast<OEDataObj**>(slot);
-        if (!child || child->GetType() != tag) return OEBS_OK;
-        return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
-    }
-    case OEFK_LIST: {
-        OEDataObjList* list = static_cast<OEDataObjList*>(slot);
-        for (unsigned short i = 0; i < list->Entries(); ++i) {
-            OEDataObj* child = list->Get(i);
-            if (!child) continue;
-            status = static_cast<OEBuildStatus>(child->BuildObject(builder, tag));
-            if (status != OEBS_OK) return Fail(builder, status);
-        }
-        return OEBS_OK;
-    }
-    default:
-        break;
-    }
     switch (row->m_kind) {
     case OEFK_TEXT:
         status = builder->AddTagOEString(tag, *static_cast<const OEString*>(slot));
@@ -742,7 +728,7 @@ OEBuildStatus OEAggregate::BuildRowWith(OEBuilder* builder, const OEFieldRow* ro
         break;
     case OEFK_ENUM: {
         unsigned short value = *static_cast<const unsigned short*>(slot);
-        if (!row->m_keywords || value >= row->m_keywords->m_count) return Fail(builder, OEBS_NOTEXTFORM);
+        if (!row->m_keywords || value >= row->m_keywords->m_count) return OEBS_NOTEXTFORM;
         if (write) {
             status = builder->AddTagElement(tag);
             if (status == OEBS_OK) status = write(builder, value);
@@ -773,6 +759,30 @@ OEBuildStatus OEAggregate::BuildRowWith(OEBuilder* builder, const OEFieldRow* ro
     default:
         break;
     }
+    return status;
+}
+
+} // namespace
+
+OEBuildStatus OEAggregate::BuildRowWith(OEBuilder* builder, const OEFieldRow* row, OEEnumWriter write) {
+    OETagID tag = row->m_tag;
+    void* slot = Slot(row);
+    if (row->m_kind == OEFK_CHILD) {
+        OEDataObj* child = *static_cast<OEDataObj**>(slot);
+        if (!child || child->GetType() != tag) return OEBS_OK;
+        return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
+    }
+    if (row->m_kind == OEFK_LIST) {
+        OEDataObjList* list = static_cast<OEDataObjList*>(slot);
+        for (unsigned short i = 0; i < list->Entries(); ++i) {
+            OEDataObj* child = list->Get(i);
+            if (!child) continue;
+            OEBuildStatus status = static_cast<OEBuildStatus>(child->BuildObject(builder, tag));
+            if (status != OEBS_OK) return Fail(builder, status);
+        }
+        return OEBS_OK;
+    }
+    OEBuildStatus status = WriteElementRow(builder, row, slot, write);
     if (status != OEBS_OK) builder->SetFailedObject(this);
     return status;
 }
@@ -800,7 +810,13 @@ int OEAggregate::Build(OEBuilder* builder) {
                 const OEFieldRow* row = &d.m_fields[i];
                 // A tag repeated in the valid table: its mark may be any of its rows' bits.
                 if (row->m_kind != OEFK_LIST && ix->m_rowDup[i] && !ValidateTag(row->m_tag)) continue;
-                OEBuildStatus status = BuildRowWith(builder, row, ix->m_rowWriter[i]);
+                OEBuildStatus status;
+                if (row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) {
+                    status = BuildRowWith(builder, row, ix->m_rowWriter[i]);
+                } else if ((status = WriteElementRow(builder, row, Slot(row), ix->m_rowWriter[i])) !=
+                           OEBS_OK) {
+                    builder->SetFailedObject(this);
+                }
                 if (status != OEBS_OK) return status;
             }
         }
