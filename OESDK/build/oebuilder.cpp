@@ -156,7 +156,7 @@ inline char* Room(OEBuffer* buffer, unsigned long n) {
     return block + buffer->GetBufferOffset();
 }
 
-// Copies n bytes that do not overlap; the short texts of tags and values (up to 16 bytes) take two
+// Copies n bytes that do not overlap; the short texts of values (up to 32 bytes) take two or four
 // overlapping word moves instead of a call.
 inline void CopyBytes(char* to, const char* from, std::size_t n) {
     std::uint64_t a, b;
