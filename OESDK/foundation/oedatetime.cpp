@@ -105,8 +105,11 @@ char* PutSigned2(char* p, int v) {
     return v < 0 ? PutSigned(p, v) : PutUnsigned(p, static_cast<unsigned>(v), 2);
 }
 
+// The zone name, at most its three letters: SetTimeZone stores a longer name as given, and the
+// text forms have room for three.
 char* PutName(char* p, const OEString3& name) {
-    for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
+    const char* s = name.c_str();
+    for (int i = 0; i < 3 && s[i]; ++i) *p++ = s[i];
     return p;
 }
 

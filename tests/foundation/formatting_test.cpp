@@ -92,9 +92,15 @@ TEST(FormatFunctions, DateTextEqualsGetDateString) {
         EXPECT_EQ(ok, 1);
         EXPECT_STREQ(viaString.c_str(), c.text);
     }
-    OEDateTime named("20240131120000[-5:EST]");
+    // A name longer than three letters (SetTimeZone keeps it as given) is written cut to three.
+    OEDateTime named("20240131120000[-5:EST]"), longName(2024, 1, 31, 0, 0, 0, 0, 0, 0);
+    longName.SetTimeZone(std::string(200, 'Z').c_str(), 2, 0);
     char text[OEDateTimeBase::kDateTextSize];
     EXPECT_EQ(std::string(text, named.FormatDate(text)), "20240131120000.000[-5:EST]");
+    EXPECT_EQ(std::string(text, longName.FormatDate(text)), "20240131000000.000[2:ZZZ]");
+    OEString time;
+    ASSERT_EQ(longName.GetTimeString(time), 1);
+    EXPECT_STREQ(time.c_str(), "000000[2:ZZZ]");
 }
 
 } // namespace
