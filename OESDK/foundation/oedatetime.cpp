@@ -68,9 +68,14 @@ bool ReadDigits(const char* p, int n, unsigned short& out) {
     return true;
 }
 
-char* Put2(char* p, unsigned v) {
-    p[0] = static_cast<char>('0' + v / 10 % 10);
-    p[1] = static_cast<char>('0' + v % 10);
+// "00" to "99", two characters per number.
+const char kPairs[] = "00010203040506070809101112131415161718192021222324252627282930313233343536373839"
+                      "40414243444546474849505152535455565758596061626364656667686970717273747576777879"
+                      "8081828384858687888990919293949596979899";
+
+// The last two decimal digits of v.
+inline char* Put2(char* p, unsigned v) {
+    std::memcpy(p, kPairs + 2 * (v % 100), 2);
     return p + 2;
 }
 
@@ -100,8 +105,11 @@ char* PutSigned2(char* p, int v) {
     return v < 0 ? PutSigned(p, v) : PutUnsigned(p, static_cast<unsigned>(v), 2);
 }
 
+// The zone name, at most its three letters: SetTimeZone stores a longer name as given, and the
+// text forms have room for three.
 char* PutName(char* p, const OEString3& name) {
-    for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
+    const char* s = name.c_str();
+    for (int i = 0; i < 3 && s[i]; ++i) *p++ = s[i];
     return p;
 }
 
@@ -514,21 +522,29 @@ unsigned short OEDateTimeBase::ParseDateTimeText(const char* text) {
     return 1;
 }
 
-unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
+unsigned short OEDateTimeBase::FormatDate(char* out) const {
     if (!IsValidDate() || !IsValidTime()) return 0;
-    char buf[48];
-    char* p = PutUnsigned(buf, m_year, 4);
+    char* p = out;
+    if (m_year < 10000) {
+        p = Put2(p, m_year / 100u);
+        p = Put2(p, m_year);
+    } else {
+        p = PutUnsigned(p, m_year, 4);
+    }
     p = Put2(p, m_month);
     p = Put2(p, m_day);
-    if (m_hour || m_minute || m_second || m_millisecond || m_tzHours || m_tzFraction) {
+    const bool zone = m_tzHours || m_tzFraction;
+    if (m_hour || m_minute || m_second || m_millisecond || zone) {
         p = Put2(p, m_hour);
         p = Put2(p, m_minute);
         p = Put2(p, m_second);
-        if (m_millisecond || m_tzHours || m_tzFraction) {
+        if (m_millisecond || zone) {
+            // Valid milliseconds are at most 999: three digits.
             *p++ = '.';
-            p = PutUnsigned(p, m_millisecond, 3);
+            *p++ = static_cast<char>('0' + m_millisecond / 100u);
+            p = Put2(p, m_millisecond);
         }
-        if (m_tzHours || m_tzFraction) {
+        if (zone) {
             *p++ = '[';
             if (m_tzHours == 0 && m_tzFraction < 0) {
                 *p++ = '-';
@@ -547,7 +563,13 @@ unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
             *p++ = ']';
         }
     }
-    return out.Assign(buf, static_cast<unsigned short>(p - buf));
+    return static_cast<unsigned short>(p - out);
+}
+
+unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
+    char buf[kDateTextSize];
+    const unsigned short n = FormatDate(buf);
+    return n ? out.Assign(buf, n) : 0;
 }
 
 unsigned short OEDateTimeBase::GetTimeString(OEString& out) const {

@@ -35,6 +35,10 @@ public:
     // Date form: YYYYMMDD[HHMMSS[.XXX][[zone[:name]]]]. 1, or 0 (out untouched) when invalid.
     virtual unsigned short GetDateString(OEString& out) const;
     virtual unsigned short IsValidDate() const;
+    // The same date form written into `out` (room for kDateTextSize bytes, no NUL added): its
+    // length, or 0 when the date-time is not valid. OEDateTimeBase::GetDateString is this text.
+    enum : unsigned short { kDateTextSize = 48 };
+    unsigned short FormatDate(char* out) const;
 
     OEDateTimeBase& operator=(const OEDateTimeBase& other);
     // Seconds since 1970 in universal time; fields become that instant, zone 0, milliseconds 0,

@@ -75,6 +75,9 @@ public:
     // number's destruction; null when memory is short. Never compare a number with 0 through
     // this conversion: use IsZero().
     virtual operator char*();
+    // The same text written into `out` (room for kTextSize bytes, NUL included); returns its
+    // length. Allocates nothing: the builder writes numbers through it.
+    unsigned short FormatText(char* out) const;
     // 30. Rescales by multiplying or truncating-dividing by ten. 31. The scale.
     virtual void Decimal(unsigned short scale);
     virtual unsigned short Decimal() const;

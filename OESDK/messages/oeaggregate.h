@@ -225,6 +225,9 @@ private:
     // the tag owns at this object's version (or -1: the tag is not valid here), exactly what
     // FindRow and SetTag's search of the valid table give.
     const OEFieldRow* Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const;
+    // BuildPresentRow with the row's enumeration writer already known (null: its keyword).
+    OEBuildStatus BuildRowWith(OEBuilder* builder, const OEFieldRow* row,
+                               OEBuildStatus (*write)(OEBuilder* builder, unsigned short value));
     // RowPresent for a known descriptor.
     unsigned short RowPresentIn(const OEAggregateDesc& d, unsigned short index) const;
     // Converts and stores the text of element row `row` whose tag owns presence bit `bit` (>= 0).
