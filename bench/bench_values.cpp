@@ -60,6 +60,32 @@ void BM_DateTimeCompare(benchmark::State& state) {
 }
 BENCHMARK(BM_DateTimeCompare);
 
+// Text to value alone, over the shapes a statement is made of (amounts, dates with and without a
+// time, with milliseconds and a zone): the path every parsed element takes.
+template <class Convert>
+void ParseCycle(benchmark::State& state, const char* const (&texts)[4], Convert convert) {
+    std::size_t i = 0;
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(convert(texts[i]));
+        i = (i + 1) & 3;
+    }
+}
+
+void BM_DecimalParse(benchmark::State& state) {
+    static const char* const kTexts[4] = {"-1234.56", "0.01", "1,000,000.00", "4999"};
+    OEPrecisionInteger n;
+    ParseCycle(state, kTexts, [&n](const char* text) { return n.ConvertStringToOEPrecisionInteger(text); });
+}
+BENCHMARK(BM_DecimalParse);
+
+void BM_DateTimeParse(benchmark::State& state) {
+    static const char* const kTexts[4] = {"20230312120000", "20240105", "20240105120000.000[-5:EST]",
+                                          "20231231235959.5"};
+    OEDateTime d;
+    ParseCycle(state, kTexts, [&d](const char* text) { return d.ConvertStringToOEDateTime(text); });
+}
+BENCHMARK(BM_DateTimeParse);
+
 void BM_KeywordLookup(benchmark::State& state) {
     OEBankTxType t = OEBTT_CREDIT;
     for (auto _ : state) {

@@ -13,6 +13,7 @@
 #include <emmintrin.h>
 #endif
 #include <string>
+#include <typeinfo>
 #include <vector>
 
 const char OEBuilder::OE_NEW_LINE[] = "\n";
@@ -57,50 +58,92 @@ inline bool NeedsEscape(char c, bool xmlQuote) {
 // The first character of [p, end) to write as an entity reference, or end.
 inline const char* FirstToEscape(const char* p, const char* end, bool xmlQuote) {
 #if defined(__SSE2__)
+    // Sixteen bytes at a time; the last block, or a text of 8 to 15 bytes read as two halves,
+    // overlaps bytes already found clean, so that no byte outside [p, end) is ever read.
     const __m128i lt = _mm_set1_epi8('<'), gt = _mm_set1_epi8('>'), amp = _mm_set1_epi8('&');
     const __m128i dq = _mm_set1_epi8(xmlQuote ? '"' : '<'), sq = _mm_set1_epi8(xmlQuote ? '\'' : '<');
-    for (; end - p >= 16; p += 16) {
-        const __m128i v = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+    auto hits = [&](__m128i v) {
         __m128i hit = _mm_or_si128(_mm_cmpeq_epi8(v, lt), _mm_cmpeq_epi8(v, gt));
         hit = _mm_or_si128(hit, _mm_cmpeq_epi8(v, amp));
         hit = _mm_or_si128(hit, _mm_or_si128(_mm_cmpeq_epi8(v, dq), _mm_cmpeq_epi8(v, sq)));
-        const unsigned mask = static_cast<unsigned>(_mm_movemask_epi8(hit));
-        if (mask) return p + __builtin_ctz(mask);
+        return static_cast<unsigned>(_mm_movemask_epi8(hit));
+    };
+    if (end - p >= 16) {
+        for (; end - p > 16; p += 16)
+            if (const unsigned mask = hits(_mm_loadu_si128(reinterpret_cast<const __m128i*>(p))))
+                return p + __builtin_ctz(mask);
+        const unsigned mask = hits(_mm_loadu_si128(reinterpret_cast<const __m128i*>(end - 16)));
+        return mask ? end - 16 + __builtin_ctz(mask) : end;
+    }
+    if (end - p >= 8) {
+        const __m128i low = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(p));
+        const __m128i high = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(end - 8));
+        const unsigned mask = hits(_mm_unpacklo_epi64(low, high));
+        if (mask & 0xFFu) return p + __builtin_ctz(mask);
+        return mask ? end - 8 + __builtin_ctz(mask >> 8) : end;
     }
 #endif
     while (p < end && !NeedsEscape(*p, xmlQuote)) ++p;
     return p;
 }
 
-// Every tag of the dictionary by id with the length of its name, looked up once for the process.
+// Every tag of the dictionary by id, looked up once for the process: the dictionary's name and
+// the ready-made texts "<NAME>\n" (whose first n + 2 bytes are the element tag) and "</NAME>\n".
+// The texts lie in one block followed by kTagSlack spare bytes, so that a tag can be copied as
+// a fixed kTagSlack bytes whatever its length.
+enum : unsigned { kTagSlack = 32 };
+
 struct TagName {
-    const char* m_text; // null: no such tag
+    const char* m_text;  // null: no such tag
+    const char* m_start; // "<NAME>\n"
+    const char* m_end;   // "</NAME>\n"
     unsigned short m_length;
 };
 
-const std::vector<TagName>& MakeTagNames() {
-    static const std::vector<TagName> names = [] {
-        std::vector<TagName> table;
+struct TagNames {
+    std::vector<TagName> m_rows;
+    std::vector<char> m_texts;
+};
+
+const TagNames& MakeTagNames() {
+    static const TagNames names = [] {
+        TagNames t;
         OETagDictionary* d = OETagDictionary::TheOETagDictionary();
         unsigned n = NumberOfOEDictionaryEntry();
-        table.assign(n + 1, TagName{nullptr, 0});
+        t.m_rows.assign(n + 1, TagName{nullptr, nullptr, nullptr, 0});
+        std::vector<std::size_t> at(n + 1, 0);
         for (unsigned id = 1; d && id <= n; ++id) {
             const char* name = d->GetTagString(static_cast<OETagID>(id));
             size_t length = name ? std::strlen(name) : 0;
-            if (length && length < 65535) table[id] = TagName{name, static_cast<unsigned short>(length)};
+            if (!length || length >= 65535 - 4) continue;
+            t.m_rows[id] = TagName{name, nullptr, nullptr, static_cast<unsigned short>(length)};
+            at[id] = t.m_texts.size();
+            for (const char* open : {"<", "</"}) {
+                t.m_texts.insert(t.m_texts.end(), open, open + std::strlen(open));
+                t.m_texts.insert(t.m_texts.end(), name, name + length);
+                t.m_texts.push_back('>');
+                t.m_texts.push_back('\n');
+            }
         }
-        return table;
+        t.m_texts.resize(t.m_texts.size() + kTagSlack, '\0');
+        for (unsigned id = 1; id <= n; ++id) {
+            TagName& row = t.m_rows[id];
+            if (!row.m_text) continue;
+            row.m_start = t.m_texts.data() + at[id];
+            row.m_end = row.m_start + row.m_length + 3;
+        }
+        return t;
     }();
     return names;
 }
 
 // Set by every builder's constructor (always the same table), then read without the guard of
 // the function-local static.
-std::atomic<const std::vector<TagName>*> g_tagNames{nullptr};
+std::atomic<const TagNames*> g_tagNames{nullptr};
 
-inline const std::vector<TagName>& TagNames() {
-    const std::vector<TagName>* names = g_tagNames.load(std::memory_order_relaxed);
-    return names ? *names : MakeTagNames();
+inline const std::vector<TagName>& TagRows() {
+    const TagNames* names = g_tagNames.load(std::memory_order_relaxed);
+    return (names ? *names : MakeTagNames()).m_rows;
 }
 
 // Room for `n` more bytes at the buffer's offset when the block already holds them (the case in
@@ -113,11 +156,21 @@ inline char* Room(OEBuffer* buffer, unsigned long n) {
     return block + buffer->GetBufferOffset();
 }
 
-// Copies n bytes that do not overlap; the short texts of tags and values (up to 16 bytes) take two
+// Copies n bytes that do not overlap; the short texts of values (up to 32 bytes) take two or four
 // overlapping word moves instead of a call.
 inline void CopyBytes(char* to, const char* from, std::size_t n) {
     std::uint64_t a, b;
-    if (n >= 8 && n <= 16) {
+    if (n > 16 && n <= 32) {
+        std::uint64_t c, d;
+        std::memcpy(&a, from, 8);
+        std::memcpy(&b, from + 8, 8);
+        std::memcpy(&c, from + n - 16, 8);
+        std::memcpy(&d, from + n - 8, 8);
+        std::memcpy(to, &a, 8);
+        std::memcpy(to + 8, &b, 8);
+        std::memcpy(to + n - 16, &c, 8);
+        std::memcpy(to + n - 8, &d, 8);
+    } else if (n >= 8 && n <= 16) {
         std::memcpy(&a, from, 8);
         std::memcpy(&b, from + n - 8, 8);
         std::memcpy(to, &a, 8);
@@ -140,6 +193,20 @@ inline void Commit(OEBuffer* buffer, const char* end) {
     const unsigned long at = static_cast<unsigned long>(end - buffer->GetBufferPtr());
     buffer->SetBufferOffset(at);
     buffer->SetBufferSize(at);
+}
+
+// Writes a dictionary tag whose block has room for a fixed-size copy; false (nothing written) when
+// the tag has no name or the block is short: the caller then takes PutTag's general path.
+inline bool FastTag(OEBuffer* buffer, OETagID tag, OETagType type) {
+    const std::vector<TagName>& names = TagRows();
+    if (tag >= names.size()) return false;
+    const TagName& name = names[tag];
+    char* p;
+    if (!name.m_text || name.m_length > kTagSlack - 4 || !(p = Room(buffer, kTagSlack))) return false;
+    std::memcpy(p, type == OETT_END ? name.m_end : name.m_start, kTagSlack);
+    const unsigned n = name.m_length;
+    Commit(buffer, p + (type == OETT_END ? n + 4 : type == OETT_ELEMENT ? n + 2 : n + 3));
+    return true;
 }
 
 } // namespace
@@ -170,15 +237,29 @@ void OEBuilder::Put(const char* text) {
     Put(text, std::strlen(text));
 }
 
+void OEBuilder::PutLine(const char* text, unsigned long length) {
+    // Text and line end in one copy when the block has room, as it usually has.
+    if (char* room = Room(m_buffer, length + 1)) {
+        CopyBytes(room, text, length);
+        room[length] = OE_NEW_LINE[0];
+        Commit(m_buffer, room + length + 1);
+        return;
+    }
+    Put(text, length);
+    Put(OE_NEW_LINE, 1);
+}
+
 const char* OEBuilder::TagText(OETagID tag) const {
-    const std::vector<TagName>& names = TagNames();
+    const std::vector<TagName>& names = TagRows();
     if (!m_dictionary || tag == 0 || tag >= names.size()) return nullptr;
     return names[tag].m_text;
 }
 
 OEBuildStatus OEBuilder::PutTag(OETagType type, OETagID tag) {
-    const std::vector<TagName>& names = TagNames();
+    const std::vector<TagName>& names = TagRows();
     if (!m_dictionary || tag == 0 || tag >= names.size() || !names[tag].m_text) return OEBS_BADARGUMENT;
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    if (FastTag(m_buffer, tag, type)) return OEBS_OK;
     return AddTag(type, names[tag].m_text, names[tag].m_length);
 }
 
@@ -242,15 +323,19 @@ OEBuildStatus OEBuilder::AddTag(OETagType type, const char* name, size_t n) {
     return OEBS_OK;
 }
 
+// The usual case inline; PutTag has every other.
 OEBuildStatus OEBuilder::AddTagStart(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_START)) return OEBS_OK;
     return PutTag(OETT_START, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagEnd(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_END)) return OEBS_OK;
     return PutTag(OETT_END, tag);
 }
 
 OEBuildStatus OEBuilder::AddTagElement(OETagID tag) {
+    if (m_dictionary && m_buffer && FastTag(m_buffer, tag, OETT_ELEMENT)) return OEBS_OK;
     return PutTag(OETT_ELEMENT, tag);
 }
 
@@ -367,15 +452,33 @@ OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt 
             }
             Put(text, n);
         } else {
-            std::string work(text, static_cast<size_t>(p - text));
-            for (; p < end; ++p) {
-                if (NeedsEscape(*p, xmlQuote))
-                    work += EntityFor(*p);
-                else
-                    work += *p;
+            // An entity is at most six characters, so a short text is escaped on the stack.
+            char small[512];
+            std::string large;
+            char* work = small;
+            if (length > (sizeof(small) - 1) / 6) {
+                large.resize(length * 6);
+                work = &large[0];
             }
-            if (truncate && work.size() > value.SpecLength()) work.resize(value.SpecLength());
-            Put(work.data(), work.size());
+            const size_t head = static_cast<size_t>(p - text);
+            std::memcpy(work, text, head);
+            char* w = work + head;
+            for (; p < end; ++p) {
+                if (const char* entity = NeedsEscape(*p, xmlQuote) ? EntityFor(*p) : nullptr) {
+                    const size_t e = std::strlen(entity);
+                    std::memcpy(w, entity, e);
+                    w += e;
+                } else {
+                    *w++ = *p;
+                }
+            }
+            size_t size = static_cast<size_t>(w - work);
+            if (truncate && size > value.SpecLength()) size = value.SpecLength();
+            if (crlf == OEBCL_NEWLINE) {
+                PutLine(work, size);
+                return OEBS_OK;
+            }
+            Put(work, size);
         }
     } else {
         Put(text, truncate ? value.SpecLength() : length);
@@ -387,10 +490,26 @@ OEBuildStatus OEBuilder::AddString(const OEString& value, OEBuildStringMacroOpt 
 OEBuildStatus OEBuilder::AddPrecisionInteger(const OEPrecisionInteger& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
     if (!value.IsValid()) return OEBS_NOTEXTFORM;
+    // The library's own number classes keep the base text form: it is written from the stack,
+    // without the number's text buffer. A class that may change the form (the payroll amount, a
+    // host's subclass) goes through its conversion operator. Comparing the type records' addresses
+    // may miss (a record duplicated across modules), never match wrongly.
+    const std::type_info* type = &typeid(value);
+    if (type == &typeid(OEPrecisionInteger) || type == &typeid(OEPosPrecisionInteger) ||
+        type == &typeid(OEPercent)) {
+        if (char* room = Room(m_buffer, OEPrecisionInteger::kTextSize + 1)) {
+            const unsigned short n = value.FormatText(room);
+            room[n] = OE_NEW_LINE[0];
+            Commit(m_buffer, room + n + 1);
+            return OEBS_OK;
+        }
+        char digits[OEPrecisionInteger::kTextSize];
+        PutLine(digits, value.FormatText(digits));
+        return OEBS_OK;
+    }
     const char* text = static_cast<const char*>(const_cast<OEPrecisionInteger&>(value));
     if (!text) return OEThreadState::GetErrorCode() == OETE_OUTOFMEMORY ? OEBS_OUTOFMEMORY : OEBS_NOTEXTFORM;
-    Put(text);
-    Put("\n", 1);
+    PutLine(text, std::strlen(text));
     return OEBS_OK;
 }
 
@@ -409,11 +528,25 @@ OEBuildStatus OEBuilder::AddRate(OEPercent value) {
 
 OEBuildStatus OEBuilder::AddDateTime(const OEDateTime& value) {
     if (!m_buffer) return OEBS_BADARGUMENT;
+    // A plain OEDateTime has the base text form: formatted straight into the block (see the type
+    // test of AddPrecisionInteger); other classes through their own GetDateString.
+    if (&typeid(value) == &typeid(OEDateTime)) {
+        char* room = Room(m_buffer, OEDateTimeBase::kDateTextSize + 1);
+        char text[OEDateTimeBase::kDateTextSize];
+        const unsigned short n = value.FormatDate(room ? room : text);
+        if (!n) return OEBS_NOTEXTFORM;
+        if (!room) {
+            PutLine(text, n);
+            return OEBS_OK;
+        }
+        room[n] = OE_NEW_LINE[0];
+        Commit(m_buffer, room + n + 1);
+        return OEBS_OK;
+    }
     // One text per thread, kept between calls: a date costs no allocation once it has grown.
     static thread_local OEString text;
     if (!const_cast<OEDateTime&>(value).GetDateString(text)) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put("\n", 1);
+    PutLine(text.c_str(), text.GetStrLength());
     return OEBS_OK;
 }
 
@@ -429,8 +562,14 @@ OEBuildStatus OEBuilder::AddTime(const OETime& value) {
 OEBuildStatus OEBuilder::PutKeywordLine(unsigned short converted, const OEString& text) {
     if (!m_buffer) return OEBS_BADARGUMENT;
     if (!converted) return OEBS_NOTEXTFORM;
-    Put(text.c_str(), text.GetStrLength());
-    Put(OE_NEW_LINE, 1);
+    PutLine(text.c_str(), text.GetStrLength());
+    return OEBS_OK;
+}
+
+OEBuildStatus OEBuilder::PutKeyword(const OEKeywordTable& table, unsigned value) {
+    if (!m_buffer) return OEBS_BADARGUMENT;
+    if (value >= table.m_count || !table.m_words[value]) return OEBS_NOTEXTFORM;
+    PutLine(table.m_words[value], std::strlen(table.m_words[value]));
     return OEBS_OK;
 }
 
@@ -454,15 +593,22 @@ OEBuildStatus OEBuilder::AddKeywordString(unsigned short converted, const OEStri
         return PutKeywordLine(OEDataConversion::Stem##ToString(value, text), text);                          \
     }
 
-OE_KEYWORD_LINE_WRITER(AddBankTxType, OEBankTxType, BankTx)
-OE_KEYWORD_LINE_WRITER(AddBankAction, OEBankAction, BankAction)
+// The enumerations whose conversion is a plain look-up in one of the keyword tables (first value
+// 0): the keyword is taken from the table itself, the conversion's own result.
+#define OE_KEYWORD_TABLE_WRITER(Writer, Param, Table)                                                        \
+    OEBuildStatus OEBuilder::Writer(Param value) {                                                           \
+        return PutKeyword(Table, static_cast<unsigned>(value));                                              \
+    }
+
+OE_KEYWORD_TABLE_WRITER(AddBankTxType, OEBankTxType, OEKW_BANKTXTYPE)
+OE_KEYWORD_TABLE_WRITER(AddBankAction, OEBankAction, OEKW_CORRECTACTION)
 OE_KEYWORD_LINE_WRITER(AddProcCode, OEProcCode, ProcCode)
 OE_KEYWORD_LINE_WRITER(AddDayOfWeek, OEDayOfWeek, DayOfWeek)
-OE_KEYWORD_LINE_WRITER(AddClientRouting, OEClientRouting, ClientRouting)
-OE_KEYWORD_LINE_WRITER(AddOFXSecurity, OEOFXSecurity, OFXSecurity)
-OE_KEYWORD_LINE_WRITER(AddSyncMode, OESyncMode, SyncMode)
+OE_KEYWORD_TABLE_WRITER(AddClientRouting, OEClientRouting, OEKW_CLIENTROUTING)
+OE_KEYWORD_TABLE_WRITER(AddOFXSecurity, OEOFXSecurity, OEKW_OFXSECURITY)
+OE_KEYWORD_TABLE_WRITER(AddSyncMode, OESyncMode, OEKW_SYNCMODE)
 OE_KEYWORD_WRITER(AddCharacterType, OECharacterType, CharacterType, AddKeywordString)
-OE_KEYWORD_LINE_WRITER(AddBankAccountType, OEBankAccountType, BankAccount)
+OE_KEYWORD_TABLE_WRITER(AddBankAccountType, OEBankAccountType, OEKW_BANKACCOUNTTYPE)
 OE_KEYWORD_LINE_WRITER(AddService, OEService, Service)
 OE_KEYWORD_LINE_WRITER(AddService2, OEService2, Service2)
 OE_KEYWORD_LINE_WRITER(AddServiceStatus, OEServiceStatus, ServiceStatus)
@@ -499,6 +645,8 @@ OE_KEYWORD_WRITER(AddCouponFreq, const OECouponFreq&, CouponFreq, AddKeywordStri
 OE_KEYWORD_WRITER(AddPayeeIDScope, const OEPayeeIDScope&, PayeeIDScope, AddKeywordString)
 
 #undef OE_KEYWORD_WRITER
+#undef OE_KEYWORD_LINE_WRITER
+#undef OE_KEYWORD_TABLE_WRITER
 
 OEBuildStatus OEBuilder::AddServerID(const OEString36& value) {
     return AddString(value, OEBSM_MACROS, OEBCL_NEWLINE);
@@ -512,11 +660,6 @@ OEBuildStatus OEBuilder::AddLanguage(const OELanguage& value) {
     if (!OEDataConversion::LanguageToString(value, text)) return OEBS_NOTEXTFORM;
     OEString3 code(text);
     return AddString(code, OEBSM_MACROS, OEBCL_NEWLINE);
-}
-
-OEBuildStatus OEBuilder::FinishElement(OETagID tag, OEBuildStatus valueStatus) {
-    if (valueStatus == OEBS_OK && m_elemEndTags == 1) return AddTagElementEnd(tag);
-    return valueStatus;
 }
 
 OEBuildStatus OEBuilder::AddTagOEServerID(OETagID tag, const OEString36& value) {
@@ -567,7 +710,10 @@ OEBuildStatus OEBuilder::AddTagOESLong(OETagID tag, long value) {
 }
 
 OEBuildStatus OEBuilder::AddTagOEString(OETagID tag, const OEString& value) {
-    if (value.IsWhiteSpace()) return OEBS_BLANKVALUE;
+    // A text that starts with a character other than white space is not blank: no scan needed.
+    const char first = value.GetStrLength() ? value.c_str()[0] : ' ';
+    const bool maybeBlank = first == ' ' || first == '\n' || first == '\r' || first == '\t';
+    if (maybeBlank && value.IsWhiteSpace()) return OEBS_BLANKVALUE;
     OEBuildStatus s = AddTagElement(tag);
     return s != OEBS_OK ? s : FinishElement(tag, AddString(value, OEBSM_MACROS, OEBCL_NEWLINE));
 }
@@ -656,8 +802,7 @@ OEBuildStatus OEBuilder::AddTagOEKeyword(OETagID tag, const char* keyword) {
     OEBuildStatus s = AddTagElement(tag);
     if (s != OEBS_OK) return s;
     // Keywords are the library's own constant texts: nothing to escape, no bound to check.
-    Put(keyword);
-    Put(OE_NEW_LINE, 1);
+    PutLine(keyword, std::strlen(keyword));
     return FinishElement(tag, OEBS_OK);
 }
 

@@ -233,10 +233,17 @@ protected:
     // Appends raw bytes; the buffer's own out-of-memory report ends the build with status 1.
     void Put(const char* text, unsigned long length);
     void Put(const char* text);
-    OEBuildStatus FinishElement(OETagID tag, OEBuildStatus valueStatus);
+    // Appends `length` bytes and OE_NEW_LINE, in one copy when the block has room.
+    void PutLine(const char* text, unsigned long length);
+    // The end tag of an element whose value was written, in the XML-like form.
+    OEBuildStatus FinishElement(OETagID tag, OEBuildStatus valueStatus) {
+        return valueStatus == OEBS_OK && m_elemEndTags == 1 ? AddTagElementEnd(tag) : valueStatus;
+    }
     // The two ways a keyword is written: `converted` is the conversion's result, `text` its output.
     OEBuildStatus PutKeywordLine(unsigned short converted, const OEString& text);
     OEBuildStatus AddKeywordString(unsigned short converted, const OEString& text);
+    // A keyword of `table` appended directly: 2 when `value` has none.
+    OEBuildStatus PutKeyword(const OEKeywordTable& table, unsigned value);
     const char* TagText(OETagID tag) const;
 
     OETagDictionary* m_dictionary;

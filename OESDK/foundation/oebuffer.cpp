@@ -191,10 +191,6 @@ unsigned long OEBuffer::GetData(OEString& out, unsigned long from, unsigned long
     return out.GetStrLength();
 }
 
-void OEBuffer::SetBufferSize(unsigned long size) {
-    m_dataSize = static_cast<std::uint32_t>(size > m_allocation ? m_allocation : size);
-}
-
 void OEBuffer::ClearBuffer(char c) {
     if (m_data) std::memset(m_data, c, m_allocation);
     m_dataSize = 0;

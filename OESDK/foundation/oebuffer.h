@@ -67,8 +67,10 @@ public:
     unsigned long GetBufferOffset() const { return m_offset; }
     void SetBufferOffset(unsigned long offset) { m_offset = static_cast<std::uint32_t>(offset); }
     unsigned long GetBufferSize() const { return m_dataSize; }
-    // Sets the data size (clamped to the allocation).
-    void SetBufferSize(unsigned long size);
+    // Sets the data size (clamped to the allocation). Inline: the builder calls it once per write.
+    void SetBufferSize(unsigned long size) {
+        m_dataSize = static_cast<std::uint32_t>(size > m_allocation ? m_allocation : size);
+    }
     unsigned long GetBufferAllocation() const { return m_allocation; }
     unsigned long GetGrowBy() const { return m_growBy; }
     char* GetBufferPtr() { return m_data; }

@@ -19,6 +19,7 @@
 #include "foundation/oeprecision.h"
 #include "foundation/oestring.h"
 
+#include <atomic>
 #include <cstdint>
 
 // A keyword table of an enumeration: keyword i is the text of value i. The aggregates' enumeration
@@ -26,6 +27,8 @@
 struct OEKeywordTable {
     const char* const* m_words;
     unsigned short m_count;
+    // The aggregates' case-insensitive lookup over the words, built on first use (null before).
+    mutable std::atomic<const void*> m_lookup{nullptr};
 };
 
 extern OE_API const OEKeywordTable OEKW_BANKACCOUNTTYPE;  // ACCTTYPE: "UNKNOWN", "CHECKING", ...

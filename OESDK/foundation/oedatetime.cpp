@@ -68,9 +68,14 @@ bool ReadDigits(const char* p, int n, unsigned short& out) {
     return true;
 }
 
-char* Put2(char* p, unsigned v) {
-    p[0] = static_cast<char>('0' + v / 10 % 10);
-    p[1] = static_cast<char>('0' + v % 10);
+// "00" to "99", two characters per number.
+const char kPairs[] = "00010203040506070809101112131415161718192021222324252627282930313233343536373839"
+                      "40414243444546474849505152535455565758596061626364656667686970717273747576777879"
+                      "8081828384858687888990919293949596979899";
+
+// The last two decimal digits of v.
+inline char* Put2(char* p, unsigned v) {
+    std::memcpy(p, kPairs + 2 * (v % 100), 2);
     return p + 2;
 }
 
@@ -100,8 +105,11 @@ char* PutSigned2(char* p, int v) {
     return v < 0 ? PutSigned(p, v) : PutUnsigned(p, static_cast<unsigned>(v), 2);
 }
 
+// The zone name, at most its three letters: SetTimeZone stores a longer name as given, and the
+// text forms have room for three.
 char* PutName(char* p, const OEString3& name) {
-    for (const char* s = name.c_str(); *s; ++s) *p++ = *s;
+    const char* s = name.c_str();
+    for (int i = 0; i < 3 && s[i]; ++i) *p++ = s[i];
     return p;
 }
 
@@ -109,11 +117,20 @@ void Warn(OEParseWarning code, const char* value, const char* context) {
     OELogParseWarning(code, value ? value : "", context);
 }
 
-} // namespace
+// True when a North American zone name does not belong to its offset of -4 to -8 whole hours.
+bool ZoneNameMismatch(const char* name, short hours, short fraction) {
+    if (hours > -4 || hours < -8 || fraction != 0 || !*name) return false;
+    static const char kStandard[5][4] = {"AST", "EST", "CST", "MST", "PST"};
+    static const char kDaylight[5][4] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
+    // Character by character: a shorter name stops at its NUL, which no table name has.
+    const auto is = [name](const char* k) {
+        return name[0] == k[0] && name[1] == k[1] && name[2] == k[2] && name[3] == 0;
+    };
+    const int i = -hours - 4;
+    return !is(kStandard[i]) && !is(kDaylight[i]);
+}
 
-OEDateTimeBase::OEDateTimeBase()
-    : m_year(0), m_month(0), m_day(0), m_hour(0), m_minute(0), m_second(0), m_millisecond(0), m_tzHours(0),
-      m_tzFraction(0), m_binary(nullptr) {}
+} // namespace
 
 OEDateTimeBase::OEDateTimeBase(short year, short month, short day, short hour, short minute, short second,
                                short millisecond, short tzHours, short tzFraction)
@@ -151,12 +168,6 @@ OEDateTimeBase& OEDateTimeBase::operator=(const OEDateTimeBase& other) {
 OEDateTimeBase& OEDateTimeBase::operator=(const char* text) {
     ConvertStringToOEDateTime(text);
     return *this;
-}
-
-void OEDateTimeBase::Invalidate() {
-    m_year = m_month = m_day = m_hour = m_minute = m_second = m_millisecond = 0;
-    m_tzHours = m_tzFraction = 0;
-    m_tzName.Truncate(0); // keeps the buffer for the next name
 }
 
 unsigned short OEDateTimeBase::IsLeapYear(unsigned short year) {
@@ -202,13 +213,7 @@ bool OEDateTimeBase::StoreTimeZone(const char* name, short hours, short fraction
     m_tzName.Assign(name, static_cast<unsigned short>(name ? std::strlen(name) : 0));
     m_tzHours = hours;
     m_tzFraction = fraction;
-    if (hours <= -4 && hours >= -8 && fraction == 0 && !m_tzName.IsEmpty()) {
-        static const char* const kStandard[5] = {"AST", "EST", "CST", "MST", "PST"};
-        static const char* const kDaylight[5] = {"EDT", "CDT", "MDT", "PDT", "YDT"};
-        const int i = -hours - 4;
-        return m_tzName != kStandard[i] && m_tzName != kDaylight[i];
-    }
-    return false;
+    return ZoneNameMismatch(m_tzName.c_str(), hours, fraction);
 }
 
 void OEDateTimeBase::LogPending(unsigned pending, const char* whole) {
@@ -282,7 +287,169 @@ unsigned short OEDateTimeBase::ExtractTimeZone(const char* zone, const char* who
     return 1;
 }
 
+// --- The common shapes, in one pass ------------------------------------------------------
+//
+// YYYYMMDD, then HH, HHMM or HHMMSS, then .X to .XXX after HHMMSS, then an optional zone
+// [[+|-]H[H][.F[F]][:NNN]] that closes the text. A text is taken here only when it has one of
+// these shapes and every field is in range; nothing is stored before that is known, and every
+// other text goes to the general reader, which says what is wrong with it.
+
+namespace {
+
+// The digit's value, or more than 9 for any other character.
+inline unsigned DigitValue(char c) {
+    return static_cast<unsigned>(static_cast<unsigned char>(c)) - static_cast<unsigned>('0');
+}
+
+// The two digits at p, or 100 when either is not a digit. The second character is read only
+// after a digit, so the end of the text is never passed.
+inline unsigned TwoDigits(const char* p) {
+    const unsigned tens = DigitValue(p[0]);
+    if (tens > 9) return 100;
+    const unsigned units = DigitValue(p[1]);
+    return units > 9 ? 100 : tens * 10 + units;
+}
+
+} // namespace
+
+struct OEDateTimeBase::CommonShape {
+    unsigned short year = 0, month = 0, day = 0;
+    unsigned short hour = 0, minute = 0, second = 0, millisecond = 0;
+    short tzHours = 0, tzFraction = 0;
+    char name[4] = {0, 0, 0, 0};
+    unsigned short nameLength = 0;
+    bool zone = false;
+
+    // YYYYMMDD, a valid date.
+    bool ReadDate(const char* p) {
+        const unsigned century = TwoDigits(p);
+        if (century > 99) return false;
+        const unsigned yy = TwoDigits(p + 2);
+        if (yy > 99) return false;
+        const unsigned mm = TwoDigits(p + 4);
+        if (mm < 1 || mm > 12) return false;
+        const unsigned dd = TwoDigits(p + 6);
+        year = static_cast<unsigned short>(century * 100 + yy);
+        month = static_cast<unsigned short>(mm);
+        day = static_cast<unsigned short>(dd);
+        if (dd >= 1 && dd <= 28) return true;
+        const bool leap = year % 4 == 0 && (year % 100 != 0 || year % 400 == 0);
+        return dd >= 1 && dd <= kDaysPerMonth[mm - 1] + (mm == 2 && leap ? 1u : 0u);
+    }
+
+    // The time and the zone, up to the end of the text.
+    bool ReadTime(const char* p) {
+        if (DigitValue(*p) <= 9) {
+            const unsigned hh = TwoDigits(p);
+            if (hh > 23) return false;
+            hour = static_cast<unsigned short>(hh);
+            p += 2;
+            if (DigitValue(*p) <= 9) {
+                const unsigned mi = TwoDigits(p);
+                if (mi > 59) return false;
+                minute = static_cast<unsigned short>(mi);
+                p += 2;
+                if (DigitValue(*p) <= 9) {
+                    const unsigned ss = TwoDigits(p);
+                    if (ss > 59) return false;
+                    second = static_cast<unsigned short>(ss);
+                    p += 2;
+                    if (*p == '.') {
+                        // One to three digits of milliseconds.
+                        unsigned ms = DigitValue(*++p);
+                        if (ms > 9) return false;
+                        ++p;
+                        for (int more = 0; more < 2 && DigitValue(*p) <= 9; ++more, ++p)
+                            ms = ms * 10 + DigitValue(*p);
+                        if (DigitValue(*p) <= 9) return false;
+                        millisecond = static_cast<unsigned short>(ms);
+                    }
+                }
+            }
+        }
+        if (*p != '[') return *p == 0;
+        zone = true;
+        ++p;
+        int sign = 1;
+        if (*p == '-' || *p == '+') sign = *p++ == '-' ? -1 : 1;
+        unsigned h = DigitValue(*p);
+        if (h > 9) return false;
+        if (DigitValue(*++p) <= 9) h = h * 10 + DigitValue(*p++);
+        if (h > 12) return false;
+        unsigned f = 0;
+        if (*p == '.') {
+            f = DigitValue(*++p);
+            if (f > 9) return false;
+            if (DigitValue(*++p) <= 9)
+                f = f * 10 + DigitValue(*p++);
+            else
+                f *= 10; // one digit counts as tenths of an hour
+        }
+        if (*p == ':')
+            for (++p; nameLength < 3 && *p && *p != ']'; ++p) name[nameLength++] = *p;
+        tzHours = static_cast<short>(sign * static_cast<int>(h));
+        tzFraction = static_cast<short>(sign * static_cast<int>(f));
+        return p[0] == ']' && p[1] == 0;
+    }
+
+    // Stores the fields read exactly as the general reader would have stored them.
+    unsigned short StoreInto(OEDateTimeBase& d, const char* whole) const {
+        if (zone) return StoreWithZone(d, whole);
+        d.m_tzHours = d.m_tzFraction = 0;
+        if (!d.m_tzName.IsEmpty()) d.m_tzName.Truncate(0);
+        StoreDateAndTime(d);
+        return 1;
+    }
+
+    void StoreDateAndTime(OEDateTimeBase& d) const {
+        d.m_year = year;
+        d.m_month = month;
+        d.m_day = day;
+        d.m_hour = hour;
+        d.m_minute = minute;
+        d.m_second = second;
+        d.m_millisecond = millisecond;
+    }
+
+    // As StoreTimeZone, with the name's length known already. Out of line: most texts have no
+    // zone, and their reading stays lean.
+    __attribute__((noinline)) unsigned short StoreWithZone(OEDateTimeBase& d, const char* whole) const {
+        d.m_tzName.Assign(name, nameLength);
+        d.m_tzHours = tzHours;
+        d.m_tzFraction = tzFraction;
+        if (nameLength && d.m_tzName.IsEmpty()) {
+            // No memory for the name: the general reader fails here, the other fields cleared.
+            d.m_year = d.m_month = d.m_day = d.m_hour = d.m_minute = d.m_second = d.m_millisecond = 0;
+            Warn(OEPW_NULLPOINTER, whole, kCtxTime);
+            return 0;
+        }
+        StoreDateAndTime(d);
+        if (ZoneNameMismatch(name, tzHours, tzFraction)) Warn(OEPW_BADFORMAT, whole, kCtxMismatch);
+        return 1;
+    }
+};
+
+// A text that is the zone name's own buffer goes the general way: clearing the fields first
+// changes such a text, and the general reader is what defines the outcome. (While the name is
+// empty its buffer holds no text that could pass for a common shape.)
+unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
+    CommonShape shape;
+    if (text && (m_tzName.IsEmpty() || text != m_tzName.c_str()) && shape.ReadDate(text) &&
+        shape.ReadTime(text + 8))
+        return shape.StoreInto(*this, text);
+    return ParseDateTimeText(text);
+}
+
 unsigned short OEDateTimeBase::ConvertStringToOETime(const char* text) {
+    CommonShape shape;
+    if (text && (m_tzName.IsEmpty() || text != m_tzName.c_str()) && shape.ReadTime(text))
+        return shape.StoreInto(*this, text);
+    return ParseTimeText(text);
+}
+
+// --- The general readers --------------------------------------------------------------------
+
+unsigned short OEDateTimeBase::ParseTimeText(const char* text) {
     unsigned pending = 0;
     if (!ParseTime(text, text, pending)) return 0;
     LogPending(pending, text);
@@ -330,7 +497,7 @@ unsigned short OEDateTimeBase::ParseTime(const char* text, const char* whole, un
     return 1;
 }
 
-unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
+unsigned short OEDateTimeBase::ParseDateTimeText(const char* text) {
     Invalidate();
     if (!text) {
         Warn(OEPW_NULLPOINTER, "", kCtxDateTime);
@@ -355,21 +522,29 @@ unsigned short OEDateTimeBase::ConvertStringToOEDateTime(const char* text) {
     return 1;
 }
 
-unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
+unsigned short OEDateTimeBase::FormatDate(char* out) const {
     if (!IsValidDate() || !IsValidTime()) return 0;
-    char buf[48];
-    char* p = PutUnsigned(buf, m_year, 4);
+    char* p = out;
+    if (m_year < 10000) {
+        p = Put2(p, m_year / 100u);
+        p = Put2(p, m_year);
+    } else {
+        p = PutUnsigned(p, m_year, 4);
+    }
     p = Put2(p, m_month);
     p = Put2(p, m_day);
-    if (m_hour || m_minute || m_second || m_millisecond || m_tzHours || m_tzFraction) {
+    const bool zone = m_tzHours || m_tzFraction;
+    if (m_hour || m_minute || m_second || m_millisecond || zone) {
         p = Put2(p, m_hour);
         p = Put2(p, m_minute);
         p = Put2(p, m_second);
-        if (m_millisecond || m_tzHours || m_tzFraction) {
+        if (m_millisecond || zone) {
+            // Valid milliseconds are at most 999: three digits.
             *p++ = '.';
-            p = PutUnsigned(p, m_millisecond, 3);
+            *p++ = static_cast<char>('0' + m_millisecond / 100u);
+            p = Put2(p, m_millisecond);
         }
-        if (m_tzHours || m_tzFraction) {
+        if (zone) {
             *p++ = '[';
             if (m_tzHours == 0 && m_tzFraction < 0) {
                 *p++ = '-';
@@ -388,7 +563,13 @@ unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
             *p++ = ']';
         }
     }
-    return out.Assign(buf, static_cast<unsigned short>(p - buf));
+    return static_cast<unsigned short>(p - out);
+}
+
+unsigned short OEDateTimeBase::GetDateString(OEString& out) const {
+    char buf[kDateTextSize];
+    const unsigned short n = FormatDate(buf);
+    return n ? out.Assign(buf, n) : 0;
 }
 
 unsigned short OEDateTimeBase::GetTimeString(OEString& out) const {

@@ -20,7 +20,9 @@ public:
     // GetTimeT of a year before 1902.
     static constexpr long long kOutOfRange = 2147483648LL;
 
-    OEDateTimeBase();
+    OEDateTimeBase()
+        : m_year(0), m_month(0), m_day(0), m_hour(0), m_minute(0), m_second(0), m_millisecond(0),
+          m_tzHours(0), m_tzFraction(0), m_binary(nullptr) {}
     OEDateTimeBase(const OEDateTimeBase& other);
     virtual ~OEDateTimeBase();
 
@@ -33,6 +35,10 @@ public:
     // Date form: YYYYMMDD[HHMMSS[.XXX][[zone[:name]]]]. 1, or 0 (out untouched) when invalid.
     virtual unsigned short GetDateString(OEString& out) const;
     virtual unsigned short IsValidDate() const;
+    // The same date form written into `out` (room for kDateTextSize bytes, no NUL added): its
+    // length, or 0 when the date-time is not valid. OEDateTimeBase::GetDateString is this text.
+    enum : unsigned short { kDateTextSize = 48 };
+    unsigned short FormatDate(char* out) const;
 
     OEDateTimeBase& operator=(const OEDateTimeBase& other);
     // Seconds since 1970 in universal time; fields become that instant, zone 0, milliseconds 0,
@@ -44,6 +50,9 @@ public:
     // the milliseconds (truncated). Returns 0 (object unchanged) when out of range or invalid.
     unsigned short FromPrecInt(const OEPrecisionInteger& seconds);
 
+    // Both read the common shapes (digits, an optional .XXX and a well-formed zone) in one pass
+    // and hand anything else to the general readers below, which they match in every result,
+    // stored field and logged warning.
     unsigned short ConvertStringToOEDateTime(const char* text);
     unsigned short ConvertStringToOETime(const char* text);
 
@@ -96,8 +105,12 @@ public:
     unsigned short operator>=(const OEDateTimeBase& other) const { return compareDateTime(other) >= 0; }
     int compareDateTime(const OEDateTimeBase& other) const;
 
-    // Clears every field (an invalid date).
-    void Invalidate();
+    // Clears every field (an invalid date). The name keeps its buffer for the next zone.
+    void Invalidate() {
+        m_year = m_month = m_day = m_hour = m_minute = m_second = m_millisecond = 0;
+        m_tzHours = m_tzFraction = 0;
+        if (!m_tzName.IsEmpty()) m_tzName.Truncate(0);
+    }
     unsigned short ExportBinary(unsigned char* block, unsigned long* size) const;
     unsigned short ImportBinary(const unsigned char* block);
     unsigned char* LockBuffer();
@@ -110,6 +123,11 @@ protected:
     // Irregularities of a zone that do not fail the parse; they are logged only once the whole
     // conversion has succeeded, so a failed conversion logs exactly its one failure.
     enum : unsigned { kZoneIrregular = 1, kZoneNameMismatch = 2 };
+    // The general readers of a date-time and of a time: every text, step by step.
+    unsigned short ParseDateTimeText(const char* text);
+    unsigned short ParseTimeText(const char* text);
+    // A text of a common shape, read whole and checked before anything is stored (oedatetime.cpp).
+    struct CommonShape;
     // `whole` is the text reported in warnings (the whole input of a date-time parse).
     unsigned short ParseTime(const char* text, const char* whole, unsigned& pending);
     // Returns 0 (warning logged) when the zone text is malformed.

@@ -40,6 +40,9 @@ protected:
     unsigned short InsertAt(unsigned short index, void* element);
     // Forgets every entry (the block stays).
     void RemoveAllEntries() { m_count = 0; }
+    // The growth increment from now on (at least 1).
+    void SetGrowBy(unsigned short growBy) { m_growBy = growBy ? growBy : 1; }
+    unsigned short GrowBy() const { return m_growBy; }
     void** Block() const { return m_block; }
 
 private:

@@ -29,6 +29,22 @@ OE_API void Free(void* block);
 // Records an allocation failure for the calling thread (error code 1).
 OE_API void ReportFailure();
 
+// Small blocks for what a parsed tree is made of (string buffers, data objects). A block of up to
+// kPoolLargest bytes is cut from a slab of the calling thread's (one pointer bump); a slab goes
+// back to the heap when its last block is freed, from whatever thread, and the thread's current
+// slab starts over whenever everything cut from it has been freed. Larger blocks come from the
+// heap. PoolAlloc's blocks are 16-byte aligned, PoolAllocBytes's (for text) 8-byte aligned. The
+// failure hook and the error code apply as to Malloc.
+// PoolFree takes only blocks of PoolAlloc (null is ignored). Under a sanitizer every block comes
+// from the heap, so that its checks see each block on its own.
+enum : std::size_t { kPoolLargest = 1024 };
+OE_API void* PoolAlloc(std::size_t bytes);
+OE_API void* PoolAllocBytes(std::size_t bytes);
+OE_API void PoolFree(void* block);
+// PoolAlloc as an operator new sees it: no failure hook and no error code (the callers of `new`
+// report a failure their own way). Library-internal.
+void* PoolAllocPlain(std::size_t bytes);
+
 // Creates an object without throwing: null (and error code 1) when memory is short.
 template <class T, class... Args> T* New(Args&&... args) {
     if (ShouldFail(sizeof(T))) {

@@ -36,16 +36,51 @@ U128 MulPow10Wrap(U128 mag, unsigned long n) {
     return mag;
 }
 
-// Writes the decimal digits of v (no leading zeros, "0" for 0); returns the count.
-int Digits32(std::uint32_t v, char* out) {
-    char tmp[10];
-    int n = 0;
-    do {
-        tmp[n++] = static_cast<char>('0' + v % 10);
-        v /= 10;
-    } while (v);
-    for (int i = 0; i < n; ++i) out[i] = tmp[n - 1 - i];
+// "00" to "99", two characters per number.
+const char kPairs[] = "00010203040506070809101112131415161718192021222324252627282930313233343536373839"
+                      "40414243444546474849505152535455565758596061626364656667686970717273747576777879"
+                      "8081828384858687888990919293949596979899";
+
+// The number of decimal digits of v (1 for 0).
+unsigned DigitCount(std::uint64_t v) {
+    unsigned n = 1;
+    for (; v >= 10000; v /= 10000) n += 4;
+    if (v >= 10) ++n;
+    if (v >= 100) ++n;
+    if (v >= 1000) ++n;
     return n;
+}
+
+// Writes the decimal digits of v (no leading zeros, "0" for 0); returns the count.
+int Digits64(std::uint64_t v, char* out) {
+    char tmp[20];
+    char* p = tmp + sizeof(tmp);
+    while (v >= 100) {
+        p -= 2;
+        std::memcpy(p, kPairs + 2 * (v % 100), 2);
+        v /= 100;
+    }
+    if (v >= 10) {
+        p -= 2;
+        std::memcpy(p, kPairs + 2 * v, 2);
+    } else {
+        *--p = static_cast<char>('0' + v);
+    }
+    const int n = static_cast<int>(tmp + sizeof(tmp) - p);
+    std::memcpy(out, p, static_cast<std::size_t>(n));
+    return n;
+}
+
+// The digits of [begin, end), other characters skipped, as one number: the magnitudes too wide
+// for 64 bits (at most 28 digits, so below 2^96). Kept out of line to leave the common reading
+// lean.
+__attribute__((noinline)) U128 WideDigits(const char* begin, const char* end) {
+    U128 mag = 0;
+    for (const char* p = begin; p < end; ++p) {
+        const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+        if (d <= 9) mag = mag * 10 + d;
+    }
+    return mag;
 }
 
 void Warn(OEParseWarning code, const char* text) {
@@ -83,9 +118,6 @@ const OEPrecisionInteger OEPrecisionInteger::OEPITenPentillion("1000000000000000
         (obj).m_mid = static_cast<std::uint32_t>(v_ >> 32);                                                  \
         (obj).m_hi = static_cast<std::uint32_t>(v_ >> 64);                                                   \
     } while (0)
-
-OEPrecisionInteger::OEPrecisionInteger()
-    : m_lo(0), m_mid(0), m_hi(0), m_sign(1), m_scale(0), m_text(nullptr), m_binary(nullptr), m_binaryLen(0) {}
 
 OEPrecisionInteger::OEPrecisionInteger(std::int32_t value, unsigned short scale) : OEPrecisionInteger() {
     m_lo = value < 0 ? 0u - static_cast<std::uint32_t>(value) : static_cast<std::uint32_t>(value);
@@ -146,7 +178,49 @@ OEPrecisionInteger& OEPrecisionInteger::operator=(const OEPrecisionInteger& othe
     return *this;
 }
 
+// The common shape [+|-]digits[.digits], with ',' among the integer digits and at most 28
+// digits in all, is read without measuring the text first (in one pass up to 19 digits); it
+// cannot fail. Any other text, the empty one included, goes to ParseText, which also says what
+// is wrong with it.
 unsigned short OEPrecisionInteger::ConvertStringToOEPrecisionInteger(const char* text) {
+    if (text) {
+        const char* p = text;
+        short sign = 1;
+        if (*p == '-' || *p == '+') sign = *p++ == '-' ? -1 : 1;
+        std::uint64_t mag = 0; // wraps harmlessly past 19 digits: such a text is read again
+        unsigned digits = 0;
+        for (;; ++p) {
+            const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+            if (d <= 9) {
+                mag = mag * 10 + d;
+                ++digits;
+            } else if (*p != ',') {
+                break;
+            }
+        }
+        unsigned scale = 0;
+        if (*p == '.') {
+            for (++p;; ++p) {
+                const unsigned d = static_cast<unsigned>(static_cast<unsigned char>(*p)) - '0';
+                if (d > 9) break;
+                mag = mag * 10 + d;
+                ++scale;
+            }
+        }
+        digits += scale;
+        if (*p == 0 && digits != 0 && digits < kMaxDigits) {
+            m_sign = sign;
+            m_scale = static_cast<unsigned short>(scale);
+            if (digits > 19) {
+                OE_SETMAG(*this, WideDigits(text, p));
+                return 1;
+            }
+            m_lo = static_cast<std::uint32_t>(mag);
+            m_mid = static_cast<std::uint32_t>(mag >> 32);
+            m_hi = 0;
+            return 1;
+        }
+    }
     if (!text) {
         m_lo = m_mid = m_hi = 0;
         m_sign = 1;
@@ -407,35 +481,62 @@ char* OEPrecisionInteger::TextBuffer() {
 OEPrecisionInteger::operator char*() {
     char* buf = TextBuffer();
     if (!buf) return nullptr;
+    FormatText(buf);
+    return buf;
+}
+
+unsigned short OEPrecisionInteger::FormatText(char* out) const {
+    char* p = out;
     if (m_scale > 29) {
-        buf[0] = '0';
-        buf[1] = '\0';
-        return buf;
+        *p++ = '0';
+        *p = '\0';
+        return 1;
     }
-    char* p = buf;
     if (m_sign == -1) *p++ = '-';
+    if (m_hi == 0 && m_mid == 0 && m_lo == 0) {
+        *p++ = '0';
+        *p = '\0';
+        return static_cast<unsigned short>(p - out);
+    }
+    if (m_hi == 0) {
+        // Up to 64 bits: trailing zeros of the fraction dropped first (the text never ends in
+        // a zero after the point, nor in the point), then the digits written from the right.
+        std::uint64_t v = (static_cast<std::uint64_t>(m_mid) << 32) | m_lo;
+        unsigned scale = m_scale;
+        while (scale > 0 && v % 10 == 0) {
+            v /= 10;
+            --scale;
+        }
+        const unsigned n = DigitCount(v);
+        // ".005" has no integer part: the fraction's missing leading digits are zeros.
+        const unsigned length = (n > scale ? n : scale) + (scale ? 1 : 0);
+        char* q = p + length;
+        *q = '\0';
+        for (unsigned i = 0; i < scale; ++i, v /= 10) *--q = static_cast<char>('0' + v % 10);
+        if (scale) *--q = '.';
+        while (v >= 10) {
+            q -= 2;
+            std::memcpy(q, kPairs + 2 * (v % 100), 2);
+            v /= 100;
+        }
+        if (v) *--q = static_cast<char>('0' + v);
+        return static_cast<unsigned short>(p + length - out);
+    }
     char digits[kMaxDigits + 1];
     int n;
     if (m_hi == 0 && m_mid == 0) {
-        if (m_lo == 0) {
-            *p++ = '0';
-            *p = '\0';
-            return buf;
-        }
-        n = Digits32(m_lo, digits);
+        n = Digits64(m_lo, digits);
     } else {
-        // Digit by digit against the table of powers of ten, by repeated subtraction.
-        const std::array<OEPrecisionInteger, 29>& table = PowerTable();
-        U128 rem = OE_MAG();
-        n = 0;
-        for (int i = 28; i >= 0; --i) {
-            const U128 pw = Pack(table[i].m_lo, table[i].m_mid, table[i].m_hi);
-            unsigned d = 0;
-            while (rem >= pw) {
-                rem -= pw;
-                ++d;
-            }
-            if (d != 0 || n != 0) digits[n++] = static_cast<char>('0' + d);
+        // Above 64 bits: the digits below 10^19 are the remainder, written with leading zeros.
+        static const U128 k10e19 = Pow10(19);
+        const U128 m = OE_MAG();
+        if (m < (static_cast<U128>(1) << 64)) {
+            n = Digits64(static_cast<std::uint64_t>(m), digits);
+        } else {
+            n = Digits64(static_cast<std::uint64_t>(m / k10e19), digits);
+            std::uint64_t low = static_cast<std::uint64_t>(m % k10e19);
+            for (int i = n + 18; i >= n; --i, low /= 10) digits[i] = static_cast<char>('0' + low % 10);
+            n += 19;
         }
     }
     const int scale = m_scale;
@@ -454,11 +555,11 @@ OEPrecisionInteger::operator char*() {
         p += n;
     }
     if (scale != 0) {
-        while (p > buf && p[-1] == '0') --p;
-        if (p > buf && p[-1] == '.') --p;
+        while (p > out && p[-1] == '0') --p;
+        if (p > out && p[-1] == '.') --p;
     }
     *p = '\0';
-    return buf;
+    return static_cast<unsigned short>(p - out);
 }
 
 void OEPrecisionInteger::Decimal(unsigned short scale) {

@@ -16,7 +16,9 @@ public:
     // Size of the binary record written by ExportBinary (18 bytes used, 2 left untouched).
     enum : unsigned short { kBinaryRecordSize = 20, kBinaryVersion = 1, kMaxDigits = 29, kTextSize = 32 };
 
-    OEPrecisionInteger();
+    OEPrecisionInteger()
+        : m_lo(0), m_mid(0), m_hi(0), m_sign(1), m_scale(0), m_text(nullptr), m_binary(nullptr),
+          m_binaryLen(0) {}
     // The raw integer is the scaled magnitude: (12345, 2) is 123.45.
     OEPrecisionInteger(std::int32_t value, unsigned short scale);
     OEPrecisionInteger(long long value, unsigned short scale);
@@ -73,6 +75,9 @@ public:
     // number's destruction; null when memory is short. Never compare a number with 0 through
     // this conversion: use IsZero().
     virtual operator char*();
+    // The same text written into `out` (room for kTextSize bytes, NUL included); returns its
+    // length. Allocates nothing: the builder writes numbers through it.
+    unsigned short FormatText(char* out) const;
     // 30. Rescales by multiplying or truncating-dividing by ten. 31. The scale.
     virtual void Decimal(unsigned short scale);
     virtual unsigned short Decimal() const;

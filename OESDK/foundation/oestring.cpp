@@ -10,6 +10,25 @@ const char kCdataOpen[] = "<![CDATA[";
 const unsigned short kCdataOpenLength = 9;
 const unsigned short kCdataCloseLength = 3;
 
+// A copy of n bytes as a few overlapping word moves when n is small (most field values are), so
+// that it costs no call; longer texts go to memcpy. Reads and writes stay inside the n bytes.
+inline void CopyBytes(char* to, const char* from, std::size_t n) {
+    if (n >= 16 && n <= 32) {
+        std::memcpy(to, from, 16);
+        std::memcpy(to + n - 16, from + n - 16, 16);
+    } else if (n >= 8 && n < 16) {
+        std::memcpy(to, from, 8);
+        std::memcpy(to + n - 8, from + n - 8, 8);
+    } else if (n >= 4 && n < 8) {
+        std::memcpy(to, from, 4);
+        std::memcpy(to + n - 4, from + n - 4, 4);
+    } else if (n < 4) {
+        for (std::size_t i = 0; i < n; ++i) to[i] = from[i];
+    } else {
+        std::memcpy(to, from, n);
+    }
+}
+
 unsigned short ClampedLength(const char* text) {
     size_t n = std::strlen(text);
     return n > OEString::kMaxLength ? static_cast<unsigned short>(OEString::kMaxLength)
@@ -26,7 +45,7 @@ OEString::OEString(const char* text, unsigned short length) : OEString() {
 }
 
 OEString::OEString(const OEString& other) : OEString() {
-    if (other.m_length) Assign(other.m_buffer, other.m_length);
+    if (other.m_length) CopyText(other.m_buffer, other.m_length);
     m_encoding = other.m_encoding;
     m_specLength = other.m_specLength;
 }
@@ -44,22 +63,34 @@ OEString::~OEString() {
 }
 
 void OEString::FreeBuffer() {
-    OEMemory::Free(m_buffer);
+    OEMemory::PoolFree(m_buffer);
     m_buffer = nullptr;
     m_bufferSize = 0;
     m_length = 0;
 }
 
-unsigned short OEString::AllocStringBuffer(unsigned short size) {
-    if (size <= m_bufferSize) return 1;
-    char* grown = static_cast<char*>(m_buffer ? OEMemory::Realloc(m_buffer, size) : OEMemory::Calloc(size));
+// Buffers come from the block pool: a string's buffer is small, short-lived and one of many.
+// Growing moves the text into a block of exactly the new size, as a reallocation would.
+unsigned short OEString::GrowBuffer(unsigned short size, bool zeroFirst) {
+    char* grown = static_cast<char*>(OEMemory::PoolAllocBytes(size));
     if (!grown) {
         FreeBuffer();
         return 0;
     }
+    if (m_buffer) {
+        std::memcpy(grown, m_buffer, m_bufferSize);
+        OEMemory::PoolFree(m_buffer);
+    } else if (zeroFirst) {
+        std::memset(grown, 0, size);
+    }
     m_buffer = grown;
     m_bufferSize = size;
     return 1;
+}
+
+unsigned short OEString::AllocStringBuffer(unsigned short size) {
+    if (size <= m_bufferSize) return 1;
+    return GrowBuffer(size, true);
 }
 
 unsigned short OEString::CopyString(const char* text) {
@@ -90,8 +121,15 @@ unsigned short OEString::Assign(const char* text, unsigned short length) {
         m_length = length;
         return 1;
     }
-    if (!AllocStringBuffer(static_cast<unsigned short>(length + 1))) return 0;
-    std::memcpy(m_buffer, text, length);
+    return CopyText(text, length);
+}
+
+// The copy-in of `length` bytes (1 to kMaxLength) that hold no NUL and do not lie in our buffer.
+// A first buffer is filled whole by the copy, so it is taken without zero-filling.
+unsigned short OEString::CopyText(const char* text, unsigned short length) {
+    const unsigned short size = static_cast<unsigned short>(length + 1);
+    if (size > m_bufferSize && !GrowBuffer(size, false)) return 0;
+    CopyBytes(m_buffer, text, length);
     m_buffer[length] = 0;
     m_length = length;
     return 1;
@@ -102,7 +140,8 @@ OEString& OEString::operator=(const OEString& other) {
     if (other.m_length == 0) {
         FreeBuffer();
     } else {
-        Assign(other.m_buffer, other.m_length);
+        // Another string's text holds no NUL and is never inside our buffer.
+        CopyText(other.m_buffer, other.m_length);
     }
     m_encoding = other.m_encoding;
     m_specLength = other.m_specLength;

@@ -89,8 +89,13 @@ protected:
     // Grows the buffer to exactly `size` bytes when it is smaller; a first buffer is
     // zero-filled. Returns 1, or 0 (thread error 1, no buffer kept) when memory is short.
     unsigned short AllocStringBuffer(unsigned short size);
+    // Moves the text into a buffer of exactly `size` bytes (> the current size); a first buffer is
+    // zero-filled when asked. 0 (no buffer kept) when memory is short.
+    unsigned short GrowBuffer(unsigned short size, bool zeroFirst);
     // Copy-in: null or empty frees the buffer and resets the string, spec length included.
     unsigned short CopyString(const char* text);
+    // Copy-in of 1 to kMaxLength bytes without NUL from outside the buffer (never zero-fills).
+    unsigned short CopyText(const char* text, unsigned short length);
     void FreeBuffer();
 
     unsigned short m_specLength;

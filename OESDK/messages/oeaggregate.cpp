@@ -58,29 +58,96 @@ OEEnumWriter EnumWriterFor(const OEKeywordTable* table) {
 
 namespace {
 
-// Case-insensitive keyword match over a table; the index or -1.
+// Case-insensitive keyword match over a table: the index of the first word equal to the text
+// ignoring ASCII case, or -1. Each table gets, on first use, a small hash of its words by length
+// and first eight letters in upper case, so a match is a probe or two instead of a walk.
 inline char UpperAscii(char c) {
     return (c >= 'a' && c <= 'z') ? static_cast<char>(c - 32) : c;
 }
 
-int MatchKeyword(const OEKeywordTable* table, const char* text) {
-    if (!table) return -1;
-    const char first = UpperAscii(*text);
-    for (unsigned short i = 0; i < table->m_count; ++i) {
-        const char* a = table->m_words[i];
-        if (UpperAscii(*a) != first) continue; // most keywords differ in their first letter
-        const char* b = text;
-        while (*a && *b) {
-            char ca = *a, cb = *b;
-            if (ca >= 'a' && ca <= 'z') ca = static_cast<char>(ca - 32);
-            if (cb >= 'a' && cb <= 'z') cb = static_cast<char>(cb - 32);
-            if (ca != cb) break;
-            ++a;
-            ++b;
-        }
-        if (!*a && !*b) return i;
+bool SameIgnoringCase(const char* a, const char* b, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i)
+        if (UpperAscii(a[i]) != UpperAscii(b[i])) return false;
+    return true;
+}
+
+// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded.
+inline std::uint64_t UpperKey(const char* text, std::size_t length) {
+    std::uint64_t key = 0;
+    const std::size_t n = length < 8 ? length : 8;
+    for (std::size_t i = 0; i < n; ++i)
+        key |= std::uint64_t(static_cast<unsigned char>(UpperAscii(text[i]))) << (8 * i);
+    return key;
+}
+
+struct KeywordLookup {
+    struct Slot {
+        std::uint64_t m_key;
+        unsigned short m_length; // 0: empty
+        unsigned short m_index;
+    };
+    unsigned m_mask;
+    Slot* m_slots;
+
+    static unsigned Hash(std::uint64_t key, std::size_t length) {
+        const std::uint64_t h = (key ^ length) * 0x9E3779B97F4A7C15ull;
+        return static_cast<unsigned>(h >> 40);
     }
-    return -1;
+    int Find(const OEKeywordTable& table, const char* text, std::size_t length) const {
+        const std::uint64_t key = UpperKey(text, length);
+        for (unsigned i = Hash(key, length) & m_mask;; i = (i + 1) & m_mask) {
+            const Slot& s = m_slots[i];
+            if (s.m_length == 0) return -1;
+            if (s.m_key == key && s.m_length == length &&
+                (length <= 8 || SameIgnoringCase(table.m_words[s.m_index] + 8, text + 8, length - 8)))
+                return s.m_index;
+        }
+    }
+};
+
+const KeywordLookup* BuildKeywordLookup(const OEKeywordTable& table) {
+    unsigned size = 8;
+    while (size < 2u * table.m_count) size *= 2;
+    unsigned char* block = new (std::nothrow) unsigned char[sizeof(KeywordLookup) + size * sizeof(KeywordLookup::Slot)];
+    if (!block) return nullptr;
+    KeywordLookup* lookup = new (block) KeywordLookup;
+    lookup->m_mask = size - 1;
+    lookup->m_slots = reinterpret_cast<KeywordLookup::Slot*>(block + sizeof(KeywordLookup));
+    for (unsigned i = 0; i < size; ++i) lookup->m_slots[i] = KeywordLookup::Slot{0, 0, 0};
+    for (unsigned short w = 0; w < table.m_count; ++w) {
+        const char* word = table.m_words[w];
+        const std::size_t length = word ? std::strlen(word) : 0;
+        if (length == 0 || length > 0xFFFF) continue; // never matched: texts are not empty here
+        if (lookup->Find(table, word, length) >= 0) continue; // an earlier word already answers
+        const std::uint64_t key = UpperKey(word, length);
+        unsigned i = KeywordLookup::Hash(key, length) & lookup->m_mask;
+        while (lookup->m_slots[i].m_length) i = (i + 1) & lookup->m_mask;
+        lookup->m_slots[i] = KeywordLookup::Slot{key, static_cast<unsigned short>(length), w};
+    }
+    return lookup;
+}
+
+int MatchKeyword(const OEKeywordTable* table, const char* text, std::size_t length) {
+    if (!table || length == 0) return -1;
+    const void* cached = table->m_lookup.load(std::memory_order_acquire);
+    if (!cached) {
+        const KeywordLookup* fresh = BuildKeywordLookup(*table);
+        if (!fresh) { // no memory for the lookup: walk the table
+            for (unsigned short i = 0; i < table->m_count; ++i) {
+                const char* word = table->m_words[i];
+                if (word && std::strlen(word) == length && SameIgnoringCase(word, text, length)) return i;
+            }
+            return -1;
+        }
+        // Another thread may have been first; the loser's lookup is dropped. Lookups live as long
+        // as the process, like the descriptors' indexes.
+        if (table->m_lookup.compare_exchange_strong(cached, fresh, std::memory_order_acq_rel)) {
+            cached = fresh;
+        } else {
+            delete[] reinterpret_cast<const unsigned char*>(fresh);
+        }
+    }
+    return static_cast<const KeywordLookup*>(cached)->Find(*table, text, length);
 }
 
 // Strict decimal number: optional sign, digits only.
@@ -116,13 +183,17 @@ struct OEAggregateIndex {
     const Slot* m_slots;
     const unsigned char* m_rowBit;
     const unsigned char* m_rowDup;
-    // For Build: per presence bit the first field row marked by it alone, each row's next row
-    // with the same bit (0xFFFF ends both), and the rows whose presence is not one bit: lists
-    // (always written) and tags repeated in the valid table.
-    const unsigned short* m_bitRow;
-    const unsigned short* m_rowNext;
-    const unsigned short* m_special;
-    unsigned short m_specialCount;
+    // For Build (descriptors of at most kMaxRows field rows): per presence bit the set of field
+    // rows it alone marks, and the set of rows whose presence is not one bit, lists (always
+    // written) and tags repeated in the valid table. Row i is bit i % 64 of word i / 64, so the
+    // union of the sets of the present bits, read from the low bit up, is the build order.
+    enum { kMaxRows = 128, kRowWords = kMaxRows / 64 };
+    typedef std::uint64_t RowSet[kRowWords];
+    const RowSet* m_bitRows; // null when the descriptor has more rows
+    unsigned short m_bitCount;
+    RowSet m_special;
+    // Per field row, the builder's value writer of its enumeration (null: the keyword is written).
+    const OEEnumWriter* m_rowWriter;
 
     static unsigned Hash(OETagID tag) { return (static_cast<unsigned>(tag) * 0x9E3779B1u) >> 16; }
     const Slot* Find(OETagID tag) const {
@@ -164,27 +235,32 @@ OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
     unsigned size = 8;
     while (size < 2u * (static_cast<unsigned>(d.m_fieldCount) + bitRows)) size *= 2;
     const std::size_t rows = d.m_fieldCount ? d.m_fieldCount : 1;
-    const std::size_t bytes = sizeof(OEAggregateIndex) + size * sizeof(Slot) +
-                              (OEDataObj::kMaxValidTags + 2 * rows) * sizeof(unsigned short) + 2 * rows;
+    const bool rowSets = d.m_fieldCount <= OEAggregateIndex::kMaxRows;
+    const std::size_t setCount = rowSets ? bitRows : 0;
+    // Slots, then the row sets and writers (8-byte aligned), then the bytes per row.
+    const std::size_t head =
+        (sizeof(OEAggregateIndex) + size * sizeof(Slot) + 7) & ~static_cast<std::size_t>(7);
+    const std::size_t bytes =
+        head + setCount * sizeof(OEAggregateIndex::RowSet) + rows * sizeof(OEEnumWriter) + 2 * rows;
     unsigned char* block = new (std::nothrow) unsigned char[bytes];
     if (!block) return nullptr;
     OEAggregateIndex* index = new (block) OEAggregateIndex;
     Slot* slots = reinterpret_cast<Slot*>(block + sizeof(OEAggregateIndex));
-    unsigned short* bitRow = reinterpret_cast<unsigned short*>(slots + size);
-    unsigned short* rowNext = bitRow + OEDataObj::kMaxValidTags;
-    unsigned short* special = rowNext + rows;
-    unsigned char* rowBit = reinterpret_cast<unsigned char*>(special + rows);
+    OEAggregateIndex::RowSet* bitSets = reinterpret_cast<OEAggregateIndex::RowSet*>(block + head);
+    OEEnumWriter* writers = reinterpret_cast<OEEnumWriter*>(bitSets + setCount);
+    unsigned char* rowBit = reinterpret_cast<unsigned char*>(writers + rows);
     unsigned char* rowDup = rowBit + rows;
     for (unsigned i = 0; i < size; ++i) slots[i] = Slot{OETAG_NONE, 0xFFFF, 0xFF, 0};
-    for (unsigned k = 0; k < OEDataObj::kMaxValidTags; ++k) bitRow[k] = 0xFFFF;
+    for (std::size_t k = 0; k < setCount; ++k)
+        for (unsigned w = 0; w < OEAggregateIndex::kRowWords; ++w) bitSets[k][w] = 0;
     index->m_mask = size - 1;
     index->m_slots = slots;
     index->m_rowBit = rowBit;
     index->m_rowDup = rowDup;
-    index->m_bitRow = bitRow;
-    index->m_rowNext = rowNext;
-    index->m_special = special;
-    index->m_specialCount = 0;
+    index->m_bitRows = rowSets ? bitSets : nullptr;
+    index->m_bitCount = static_cast<unsigned short>(setCount);
+    for (unsigned w = 0; w < OEAggregateIndex::kRowWords; ++w) index->m_special[w] = 0;
+    index->m_rowWriter = writers;
     auto slotOf = [&](OETagID tag) -> Slot* {
         unsigned i = OEAggregateIndex::Hash(tag) & index->m_mask;
         while (slots[i].m_tag != OETAG_NONE && slots[i].m_tag != tag) i = (i + 1) & index->m_mask;
@@ -202,23 +278,20 @@ OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
     for (unsigned short i = 0; i < d.m_fieldCount; ++i) {
         rowBit[i] = 0xFF;
         rowDup[i] = 0;
+        writers[i] = d.m_fields[i].m_kind == OEFK_ENUM ? EnumWriterFor(d.m_fields[i].m_keywords) : nullptr;
         if (d.m_fields[i].m_tag == OETAG_NONE) continue;
         Slot* s = slotOf(d.m_fields[i].m_tag);
         if (s->m_row == 0xFFFF) s->m_row = i;
         rowBit[i] = s->m_bit;
         rowDup[i] = s->m_dup;
     }
-    // Rows in ascending order along each bit's chain.
-    for (unsigned short i = d.m_fieldCount; i-- > 0;) {
-        rowNext[i] = 0xFFFF;
-        if (d.m_fields[i].m_kind == OEFK_LIST || rowDup[i]) continue;
-        if (rowBit[i] == 0xFF) continue; // never present
-        rowNext[i] = bitRow[rowBit[i]];
-        bitRow[rowBit[i]] = i;
-    }
-    for (unsigned short i = 0; i < d.m_fieldCount; ++i)
+    for (unsigned short i = 0; rowSets && i < d.m_fieldCount; ++i) {
+        const std::uint64_t bit = std::uint64_t(1) << (i % 64);
         if (d.m_fields[i].m_kind == OEFK_LIST || (rowDup[i] && rowBit[i] != 0xFF))
-            special[index->m_specialCount++] = i;
+            index->m_special[i / 64] |= bit;
+        else if (rowBit[i] != 0xFF) // else never present
+            bitSets[rowBit[i]][i / 64] |= bit;
+    }
     return index;
 }
 
@@ -383,6 +456,32 @@ unsigned short OEAggregate::SetFromText(OETagID tag, const OEString& text) {
     return StoreText(row, bit, text);
 }
 
+namespace {
+
+// A second value for a field already present converts through a copy, so that a refused text
+// leaves the old value. Out of line: the common first value needs no temporary.
+#if defined(__GNUC__)
+#define OE_NOINLINE __attribute__((noinline))
+#else
+#define OE_NOINLINE
+#endif
+OE_NOINLINE bool ReplaceAmount(OEPrecisionInteger& field, const char* text) {
+    OEPrecisionInteger value;
+    if (!value.ConvertStringToOEPrecisionInteger(text) || !value.IsValid()) return false;
+    field = value;
+    return true;
+}
+
+OE_NOINLINE bool ReplaceDateTime(OEDateTime& field, const char* text) {
+    OEDateTime value;
+    if (!value.ConvertStringToOEDateTime(text)) return false;
+    field = value;
+    return true;
+}
+#undef OE_NOINLINE
+
+} // namespace
+
 unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
     const OETagID tag = row->m_tag;
     const unsigned short mark = static_cast<unsigned short>(bit);
@@ -405,10 +504,8 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
         OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
         if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
-        } else {
-            OEPrecisionInteger value;
-            if (!value.ConvertStringToOEPrecisionInteger(s) || !value.IsValid()) break;
-            *field = value;
+        } else if (!ReplaceAmount(*field, s)) {
+            break;
         }
         SetPresentBit(mark);
         return 1;
@@ -417,10 +514,8 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
         OEDateTime* field = static_cast<OEDateTime*>(slot);
         if (!PresentBit(mark)) {
             if (!field->ConvertStringToOEDateTime(s)) break;
-        } else {
-            OEDateTime value;
-            if (!value.ConvertStringToOEDateTime(s)) break;
-            *field = value;
+        } else if (!ReplaceDateTime(*field, s)) {
+            break;
         }
         SetPresentBit(mark);
         return 1;
@@ -428,7 +523,7 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
     case OEFK_TEXTLIST:
         return AppendText(tag, text);
     case OEFK_ENUM: {
-        int keyword = MatchKeyword(row->m_keywords, s);
+        int keyword = MatchKeyword(row->m_keywords, s, text.GetStrLength());
         if (keyword < 0) break;
         *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
         SetPresentBit(mark);
@@ -690,28 +785,26 @@ OEBuildStatus OEAggregate::BuildRow(OEBuilder* builder, const OEFieldRow* row) {
 }
 
 OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow* row) {
-    OETagID tag = row->m_tag;
-    void* slot = Slot(row);
+    if (row->m_kind != OEFK_ENUM) return BuildRowWith(builder, row, nullptr);
+    // The row's writer from the index when the row is one of this class's own.
+    const OEAggregateDesc& d = Describe();
+    const OEAggregateIndex* ix = d.Index();
+    const std::uintptr_t at = reinterpret_cast<std::uintptr_t>(row),
+                         first = reinterpret_cast<std::uintptr_t>(d.m_fields);
+    if (ix && at >= first && at < first + d.m_fieldCount * sizeof(OEFieldRow))
+        return BuildRowWith(builder, row, ix->m_rowWriter[(at - first) / sizeof(OEFieldRow)]);
+    return BuildRowWith(builder, row, EnumWriterFor(row->m_keywords));
+}
+
+namespace {
+
+// Writes an element row (any kind but a child or a list) whose value is at `slot`; the caller
+// records the failure. Kept apart from the child rows, which recurse, so that the common case
+// saves and restores little.
+OEBuildStatus WriteElementRow(OEBuilder* builder, const OEFieldRow* row, const void* slot,
+                              OEEnumWriter write) {
+    const OETagID tag = row->m_tag;
     OEBuildStatus status = OEBS_OK;
-    switch (row->m_kind) {
-    case OEFK_CHILD: {
-        OEDataObj* child = *static_cast<OEDataObj**>(slot);
-        if (!child || child->GetType() != tag) return OEBS_OK;
-        return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
-    }
-    case OEFK_LIST: {
-        OEDataObjList* list = static_cast<OEDataObjList*>(slot);
-        for (unsigned short i = 0; i < list->Entries(); ++i) {
-            OEDataObj* child = list->Get(i);
-            if (!child) continue;
-            status = static_cast<OEBuildStatus>(child->BuildObject(builder, tag));
-            if (status != OEBS_OK) return Fail(builder, status);
-        }
-        return OEBS_OK;
-    }
-    default:
-        break;
-    }
     switch (row->m_kind) {
     case OEFK_TEXT:
         status = builder->AddTagOEString(tag, *static_cast<const OEString*>(slot));
@@ -724,8 +817,8 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
         break;
     case OEFK_ENUM: {
         unsigned short value = *static_cast<const unsigned short*>(slot);
-        if (!row->m_keywords || value >= row->m_keywords->m_count) return Fail(builder, OEBS_NOTEXTFORM);
-        if (OEEnumWriter write = EnumWriterFor(row->m_keywords)) {
+        if (!row->m_keywords || value >= row->m_keywords->m_count) return OEBS_NOTEXTFORM;
+        if (write) {
             status = builder->AddTagElement(tag);
             if (status == OEBS_OK) status = write(builder, value);
             if (status == OEBS_OK && builder->GetElemEndTags() == 1) status = builder->AddTagElementEnd(tag);
@@ -755,40 +848,66 @@ OEBuildStatus OEAggregate::BuildPresentRow(OEBuilder* builder, const OEFieldRow*
     default:
         break;
     }
-    return Fail(builder, status);
+    return status;
+}
+
+} // namespace
+
+OEBuildStatus OEAggregate::BuildRowWith(OEBuilder* builder, const OEFieldRow* row, OEEnumWriter write) {
+    OETagID tag = row->m_tag;
+    void* slot = Slot(row);
+    if (row->m_kind == OEFK_CHILD) {
+        OEDataObj* child = *static_cast<OEDataObj**>(slot);
+        if (!child || child->GetType() != tag) return OEBS_OK;
+        return Fail(builder, static_cast<OEBuildStatus>(child->BuildObject(builder, tag)));
+    }
+    if (row->m_kind == OEFK_LIST) {
+        OEDataObjList* list = static_cast<OEDataObjList*>(slot);
+        for (unsigned short i = 0; i < list->Entries(); ++i) {
+            OEDataObj* child = list->Get(i);
+            if (!child) continue;
+            OEBuildStatus status = static_cast<OEBuildStatus>(child->BuildObject(builder, tag));
+            if (status != OEBS_OK) return Fail(builder, status);
+        }
+        return OEBS_OK;
+    }
+    OEBuildStatus status = WriteElementRow(builder, row, slot, write);
+    if (status != OEBS_OK) builder->SetFailedObject(this);
+    return status;
 }
 
 int OEAggregate::Build(OEBuilder* builder) {
     const OEAggregateDesc& d = Describe();
     const OEAggregateIndex* ix = d.Index();
     const unsigned short version = StoredMsgSetVersion();
-    enum { kMaxOrdered = 128 };
-    if (ix && d.m_fieldCount <= kMaxOrdered) {
+    if (ix && ix->m_bitRows) {
         // The rows to write, found from the set presence bits rather than by testing every row
-        // (most rows of a large aggregate are absent), then put back into build order.
-        unsigned short order[kMaxOrdered];
-        unsigned n = 0;
+        // (most rows of a large aggregate are absent): the union of their row sets is already in
+        // build order.
+        OEAggregateIndex::RowSet rows;
+        for (unsigned w = 0; w < OEAggregateIndex::kRowWords; ++w) rows[w] = ix->m_special[w];
         for (unsigned short w = 0; w < 3; ++w) {
             for (std::uint32_t bits = GetPresentWord(w); bits; bits &= bits - 1) {
                 const unsigned k = w * 32u + static_cast<unsigned>(__builtin_ctz(bits));
-                unsigned short r = ix->m_bitRow[k];
-                if (r == 0xFFFF || !(d.m_valid[k].m_versionMask & version)) continue;
-                for (; r != 0xFFFF; r = ix->m_rowNext[r]) order[n++] = r;
+                if (k >= ix->m_bitCount || !(d.m_valid[k].m_versionMask & version)) continue;
+                for (unsigned i = 0; i < OEAggregateIndex::kRowWords; ++i) rows[i] |= ix->m_bitRows[k][i];
             }
         }
-        for (unsigned short i = 0; i < ix->m_specialCount; ++i) order[n++] = ix->m_special[i];
-        for (unsigned i = 1; i < n; ++i) {
-            const unsigned short r = order[i];
-            unsigned j = i;
-            for (; j > 0 && order[j - 1] > r; --j) order[j] = order[j - 1];
-            order[j] = r;
-        }
-        for (unsigned i = 0; i < n; ++i) {
-            const OEFieldRow* row = &d.m_fields[order[i]];
-            // A tag repeated in the valid table: its mark may be any of its rows' bits.
-            if (row->m_kind != OEFK_LIST && ix->m_rowDup[order[i]] && !ValidateTag(row->m_tag)) continue;
-            OEBuildStatus status = BuildPresentRow(builder, row);
-            if (status != OEBS_OK) return status;
+        for (unsigned w = 0; w < OEAggregateIndex::kRowWords; ++w) {
+            for (std::uint64_t set = rows[w]; set; set &= set - 1) {
+                const unsigned i = w * 64u + static_cast<unsigned>(__builtin_ctzll(set));
+                const OEFieldRow* row = &d.m_fields[i];
+                // A tag repeated in the valid table: its mark may be any of its rows' bits.
+                if (row->m_kind != OEFK_LIST && ix->m_rowDup[i] && !ValidateTag(row->m_tag)) continue;
+                OEBuildStatus status;
+                if (row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) {
+                    status = BuildRowWith(builder, row, ix->m_rowWriter[i]);
+                } else if ((status = WriteElementRow(builder, row, Slot(row), ix->m_rowWriter[i])) !=
+                           OEBS_OK) {
+                    builder->SetFailedObject(this);
+                }
+                if (status != OEBS_OK) return status;
+            }
         }
         return OEBS_OK;
     }

@@ -103,7 +103,18 @@ struct OEAggregateDesc {
         return desc;                                                                                         \
     }
 
-typedef OEPtrArray<OEDataObj> OEDataObjList;
+// The owned list of a list row. Its growth step keeps up with its length (half its entries once
+// it holds more than ten), so reading a statement of many thousand transactions does not move
+// the list over and over.
+class OE_API OEDataObjList : public OEPtrArray<OEDataObj> {
+public:
+    using OEPtrArray<OEDataObj>::OEPtrArray;
+    unsigned short Append(OEDataObj* element) {
+        const unsigned short n = Entries();
+        if (n >= Capacity() && n > 10 && GrowBy() < n / 2) SetGrowBy(static_cast<unsigned short>(n / 2));
+        return OEPtrArray<OEDataObj>::Append(element);
+    }
+};
 
 // The storage of a child row: one owned child, deleted with the member. (Standard layout with the
 // pointer first, so the slot's address is also the address of the pointer.)
@@ -214,6 +225,9 @@ private:
     // the tag owns at this object's version (or -1: the tag is not valid here), exactly what
     // FindRow and SetTag's search of the valid table give.
     const OEFieldRow* Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const;
+    // BuildPresentRow with the row's enumeration writer already known (null: its keyword).
+    OEBuildStatus BuildRowWith(OEBuilder* builder, const OEFieldRow* row,
+                               OEBuildStatus (*write)(OEBuilder* builder, unsigned short value));
     // RowPresent for a known descriptor.
     unsigned short RowPresentIn(const OEAggregateDesc& d, unsigned short index) const;
     // Converts and stores the text of element row `row` whose tag owns presence bit `bit` (>= 0).

@@ -20,6 +20,24 @@ unsigned short OEDataObj::m_factoryAllocated = 0;
 // Every constructor clears m_factoryAllocated on purpose: once any data object has been made
 // after the library created its default factory, no data object's destruction frees it (the
 // factory then lives until SetFactory replaces it).
+void* OEDataObj::operator new(std::size_t bytes) {
+    void* block = OEMemory::PoolAllocPlain(bytes);
+    if (!block) throw std::bad_alloc();
+    return block;
+}
+
+void* OEDataObj::operator new(std::size_t bytes, const std::nothrow_t&) noexcept {
+    return OEMemory::PoolAllocPlain(bytes);
+}
+
+void OEDataObj::operator delete(void* block) noexcept {
+    OEMemory::PoolFree(block);
+}
+
+void OEDataObj::operator delete(void* block, const std::nothrow_t&) noexcept {
+    OEMemory::PoolFree(block);
+}
+
 OEDataObj::OEDataObj(unsigned short msgSetVersion)
     : m_parser(nullptr), m_present{0, 0, 0}, m_type(OETAG_NONE), m_msgSetVersion(msgSetVersion) {
     m_factoryAllocated = 0;

@@ -15,7 +15,9 @@
 #include "tags/oetagdictionary.h"
 #include "tags/oetagid.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <new>
 
 class OEParser;
 class OEBuilder;
@@ -56,6 +58,15 @@ public:
     explicit OEDataObj(unsigned short msgSetVersion = 0);
     OEDataObj(const OEDataObj& other);
     OEDataObj& operator=(const OEDataObj& other);
+
+    // Data objects live in the block pool (OEMemory::PoolAlloc): a parsed tree is made of many
+    // small objects created together and usually deleted together. Every `new` of a data object,
+    // the host's own subclasses included, takes this route, and `delete` gives the block back to
+    // the library whichever module deletes it.
+    static void* operator new(std::size_t bytes);
+    static void* operator new(std::size_t bytes, const std::nothrow_t&) noexcept;
+    static void operator delete(void* block) noexcept;
+    static void operator delete(void* block, const std::nothrow_t&) noexcept;
 
     // Virtual slots, in this order.
     virtual ~OEDataObj();

@@ -5,8 +5,10 @@
 
 #include <gtest/gtest.h>
 
+#include <cctype>
 #include <memory>
 #include <set>
+#include <string>
 #include <sstream>
 #include <vector>
 
@@ -206,6 +208,26 @@ TEST(Statement, XmlDocumentParsesIntoTheSameTreeAsItsSgmlTwin) {
     std::vector<std::string> rows = Transactions(xml.get());
     ASSERT_EQ(rows.size(), 1u);
     EXPECT_EQ(rows[0], "555|20240102|DIRECTDEBIT|-12.50|A1|Cafe & Bar|lunch|");
+}
+
+// Every word of the transaction-type table is read back as its own value whatever its case,
+// including the two that share their first eight letters; near misses are refused and logged.
+TEST(Statement, TransactionTypeKeywordsMatchIgnoringCaseOnly) {
+    std::unique_ptr<OEBankStatementTx> tx(OEDataObj::GetFactory()->NewBankStatementTx(1));
+    for (unsigned short i = 0; i < OEKW_BANKTXTYPE.m_count; ++i) {
+        std::string word = OEKW_BANKTXTYPE.m_words[i];
+        std::string mixed = word;
+        for (std::size_t k = 0; k < mixed.size(); k += 2) mixed[k] = static_cast<char>(std::tolower(mixed[k]));
+        for (const std::string& text : {word, mixed}) {
+            ASSERT_EQ(tx->SetTxType(OEString(text.c_str())), 1) << text;
+            EXPECT_EQ(tx->GetTxType(), i) << text;
+        }
+    }
+    tx->SetTxType(OEString("DEBIT"));
+    for (const char* miss : {"DIRECTDE", "DIRECTDEBIX", "DIRECTDEBITS", "DIRECTDEPX", "DEBIT ", "XDEBIT", "DEBI"}) {
+        EXPECT_EQ(tx->SetTxType(OEString(miss)), 0) << miss;
+        EXPECT_STREQ(tx->GetTxTypeText(), "DEBIT") << "a refused word leaves the value";
+    }
 }
 
 TEST(Statement, TransactionRulesAndBuildOrder) {
