@@ -489,11 +489,9 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
     const char* s = text.c_str();
     switch (row->m_kind) {
     case OEFK_TEXT: {
+        // Every field string keeps its own limit, whatever its class.
         OEString* str = static_cast<OEString*>(slot);
-        unsigned short spec = str->SpecLength();
-        *str = text;
-        str->SetSpecLength(spec);
-        if (text.GetStrLength() && str->IsNull()) return 3; // no memory for the value
+        if (!str->AssignText(text)) return 3; // no memory for the value
         if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
         SetPresentBit(mark);
         return 1;
