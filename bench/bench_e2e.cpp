@@ -93,8 +93,8 @@ void ParseToTree(benchmark::State& state, OFXForm form) {
     state.counters["file_MB"] = static_cast<double>(text.size()) / 1e6;
     state.counters["transactions"] = static_cast<double>(CountTransactions(text));
     if (treeHeap)
-        state.counters["heap_x_file"] = static_cast<double>(treeHeap + buffer->GetBufferAllocation()) /
-                                        static_cast<double>(text.size());
+        state.counters["heap_x_file"] =
+            static_cast<double>(treeHeap + buffer->GetBufferAllocation()) / static_cast<double>(text.size());
 }
 
 void BuildToText(benchmark::State& state, OFXForm form) {

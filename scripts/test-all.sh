@@ -155,6 +155,7 @@ leg_sanitize() {
   step "sanitize: configure ($cxx)" "$logs/sanitize-configure.log" \
     env CXX="$cxx" cmake -S . -B "$b" -G Ninja -DCMAKE_BUILD_TYPE=Debug -DCMAKE_CXX_FLAGS_DEBUG="-O1 -g" \
     -DOESDK_WERROR=ON -DOESDK_SANITIZE=ON -DOESDK_BUILD_BENCH=OFF || return
+  step "sanitize: source layout (clang-format)" - scripts/check-format.sh
   step "sanitize: build (-j$jobs)" "$logs/sanitize-build.log" cmake --build "$b" -j"$jobs" || return
   symbolizer=$(command -v llvm-symbolizer-14 || command -v llvm-symbolizer || true)
   # Every report ends the test with a failure; leaks are reported at exit.

@@ -148,6 +148,16 @@ OEString& OEString::operator=(const OEString& other) {
     return *this;
 }
 
+unsigned short OEString::AssignText(const OEString& other) {
+    if (this == &other) return 1;
+    m_encoding = other.m_encoding;
+    if (other.m_length == 0) {
+        FreeBuffer();
+        return 1;
+    }
+    return CopyText(other.m_buffer, other.m_length);
+}
+
 OEString& OEString::operator=(OEString&& other) noexcept {
     if (this == &other) return *this;
     FreeBuffer();

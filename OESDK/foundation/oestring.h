@@ -40,6 +40,10 @@ public:
     OEString& operator+=(const char* text);
     OEString& operator+=(char c);
 
+    // Takes another string's text and encoding but keeps this string's spec length (the limit
+    // belongs to the field). Returns 1, or 0 when memory is short (the string is then empty).
+    unsigned short AssignText(const OEString& other);
+
     // Replaces the text by a slice of `length` bytes (stops early at a NUL); the buffer grows to
     // exactly length + 1 when it is too small. Returns 1, or 0 when memory is short.
     unsigned short Assign(const char* text, unsigned short length);

@@ -4,7 +4,6 @@
 
 namespace {
 
-
 // ---- BANKACCTFROM / BANKACCTTO ----
 const OETagRow kBankAcctValid[] = {{OETAG_BANKID, OEVM_ALL, 0},      {OETAG_BRANCHID, OEVM_ALL, 0},
                                    {OETAG_ACCTID, OEVM_ALL, 0},      {OETAG_ACCTTYPE, OEVM_V1, 0},
@@ -86,7 +85,6 @@ const OEAggregateDesc kPayeeDesc = OE_DESC(OETAG_PAYEE, kPayeeValid, kPayeeRequi
 const OEAggregateDesc kPayee2Desc = OE_DESC(OETAG_PAYEE2, kPayeeValid, kPayee2Required, kPayeeFields);
 
 } // namespace
-
 
 OEBankAccount::OEBankAccount(unsigned short version) : OEBankOrCCAccount(version) {
     SetType(OETAG_BANKACCTFROM);

@@ -108,7 +108,8 @@ struct KeywordLookup {
 const KeywordLookup* BuildKeywordLookup(const OEKeywordTable& table) {
     unsigned size = 8;
     while (size < 2u * table.m_count) size *= 2;
-    unsigned char* block = new (std::nothrow) unsigned char[sizeof(KeywordLookup) + size * sizeof(KeywordLookup::Slot)];
+    unsigned char* block =
+        new (std::nothrow) unsigned char[sizeof(KeywordLookup) + size * sizeof(KeywordLookup::Slot)];
     if (!block) return nullptr;
     KeywordLookup* lookup = new (block) KeywordLookup;
     lookup->m_mask = size - 1;
@@ -117,7 +118,7 @@ const KeywordLookup* BuildKeywordLookup(const OEKeywordTable& table) {
     for (unsigned short w = 0; w < table.m_count; ++w) {
         const char* word = table.m_words[w];
         const std::size_t length = word ? std::strlen(word) : 0;
-        if (length == 0 || length > 0xFFFF) continue; // never matched: texts are not empty here
+        if (length == 0 || length > 0xFFFF) continue;         // never matched: texts are not empty here
         if (lookup->Find(table, word, length) >= 0) continue; // an earlier word already answers
         const std::uint64_t key = UpperKey(word, length);
         unsigned i = KeywordLookup::Hash(key, length) & lookup->m_mask;
@@ -489,11 +490,9 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
     const char* s = text.c_str();
     switch (row->m_kind) {
     case OEFK_TEXT: {
+        // Every field string keeps its own limit, whatever its class.
         OEString* str = static_cast<OEString*>(slot);
-        unsigned short spec = str->SpecLength();
-        *str = text;
-        str->SetSpecLength(spec);
-        if (text.GetStrLength() && str->IsNull()) return 3; // no memory for the value
+        if (!str->AssignText(text)) return 3; // no memory for the value
         if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
         SetPresentBit(mark);
         return 1;

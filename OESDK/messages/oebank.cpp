@@ -6,7 +6,6 @@
 
 namespace {
 
-
 // ---- STMTTRN ----
 const OETagRow kTxValid[] = {
     {OETAG_TRNTYPE, OEVM_ALL, 0},      {OETAG_DTPOSTED, OEVM_ALL, 0},      {OETAG_DTUSER, OEVM_ALL, 0},
@@ -135,7 +134,6 @@ const OEAggregateDesc kCCStmtRqDesc =
     OE_DESC(OETAG_CCSTMTRQ, kCCStmtRqValid, kCCStmtRqRequired, kCCStmtRqFields);
 
 } // namespace
-
 
 // ---------------------------------------------------------------- STMTTRN
 

@@ -3,6 +3,6 @@
 #ifndef OESDK_TAGS_OEHEADERTAG_H
 #define OESDK_TAGS_OEHEADERTAG_H
 
-#include "foundation/oeenums.h"  // enum OEHeaderTag (OEHT_UNKNOWN = -1, then 0 to 10)
+#include "foundation/oeenums.h" // enum OEHeaderTag (OEHT_UNKNOWN = -1, then 0 to 10)
 
 #endif

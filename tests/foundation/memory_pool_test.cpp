@@ -129,7 +129,8 @@ TEST(MemoryPool, StringsMovedBetweenThreadsOutliveTheirMaker) {
     std::thread([&] {
         for (std::size_t i = 0; i < texts.size(); ++i) texts[i] = OEString(std::to_string(i * 7919).c_str());
     }).join();
-    for (std::size_t i = 0; i < texts.size(); ++i) EXPECT_STREQ(texts[i].c_str(), std::to_string(i * 7919).c_str());
+    for (std::size_t i = 0; i < texts.size(); ++i)
+        EXPECT_STREQ(texts[i].c_str(), std::to_string(i * 7919).c_str());
     texts.clear();
 }
 

@@ -94,6 +94,38 @@ TEST(OEString, AssignmentCopiesEncodingAndSpecButMultiLenKeepsItsLimit) {
     EXPECT_EQ(multi.SpecLength(), 80);
 }
 
+// AssignText is what a field takes a parsed value with: text and encoding, never the limit.
+TEST(OEString, AssignTextKeepsTheFieldsLimitWhateverItsClass) {
+    OEString src("a value of some length");
+    src.SetEncoding(OESE_CDATA);
+    OEString12 bounded;
+    OEMultiLenString multi;
+    multi.SetSpecLength(80);
+    OEString plain;
+    plain.SetSpecLength(5);
+    struct Case {
+        OEString* field;
+        unsigned short spec;
+    } cases[] = {{&bounded, 12}, {&multi, 80}, {&plain, 5}};
+    for (const Case& c : cases) {
+        ASSERT_EQ(c.field->AssignText(src), 1);
+        EXPECT_STREQ(c.field->c_str(), "a value of some length");
+        EXPECT_EQ(c.field->GetEncoding(), OESE_CDATA);
+        EXPECT_EQ(c.field->SpecLength(), c.spec);
+        EXPECT_EQ(c.field->ExceedsSpecLength(), src.GetStrLength() > c.spec ? 1 : 0);
+        EXPECT_EQ(c.field->AssignText(OEString()), 1);
+        EXPECT_TRUE(c.field->IsEmpty());
+        EXPECT_EQ(c.field->SpecLength(), c.spec);
+    }
+    OEString target("old");
+    {
+        FailAllocations fail;
+        EXPECT_EQ(target.AssignText(src), 0);
+    }
+    EXPECT_TRUE(target.IsEmpty()) << "no memory: no half value";
+    OEThreadState::SetErrorCode(OETE_NONE);
+}
+
 TEST(OEString, Comparisons) {
     OEString empty, null2, abc("abc"), abd("abd"), ABC("ABC");
     OEString emptied("x");

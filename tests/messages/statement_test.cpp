@@ -217,14 +217,16 @@ TEST(Statement, TransactionTypeKeywordsMatchIgnoringCaseOnly) {
     for (unsigned short i = 0; i < OEKW_BANKTXTYPE.m_count; ++i) {
         std::string word = OEKW_BANKTXTYPE.m_words[i];
         std::string mixed = word;
-        for (std::size_t k = 0; k < mixed.size(); k += 2) mixed[k] = static_cast<char>(std::tolower(mixed[k]));
+        for (std::size_t k = 0; k < mixed.size(); k += 2)
+            mixed[k] = static_cast<char>(std::tolower(mixed[k]));
         for (const std::string& text : {word, mixed}) {
             ASSERT_EQ(tx->SetTxType(OEString(text.c_str())), 1) << text;
             EXPECT_EQ(tx->GetTxType(), i) << text;
         }
     }
     tx->SetTxType(OEString("DEBIT"));
-    for (const char* miss : {"DIRECTDE", "DIRECTDEBIX", "DIRECTDEBITS", "DIRECTDEPX", "DEBIT ", "XDEBIT", "DEBI"}) {
+    for (const char* miss :
+         {"DIRECTDE", "DIRECTDEBIX", "DIRECTDEBITS", "DIRECTDEPX", "DEBIT ", "XDEBIT", "DEBI"}) {
         EXPECT_EQ(tx->SetTxType(OEString(miss)), 0) << miss;
         EXPECT_STREQ(tx->GetTxTypeText(), "DEBIT") << "a refused word leaves the value";
     }
