@@ -41,6 +41,8 @@ TEST(BuilderValuePaths, NumbersAndDatesOfEveryClassKeepTheirTextForm) {
     OEDateTime plain("20240131235959.999[-3.5:NST]"), midnight("20240229");
     OEDateTime invalid(2023, 2, 29, 0, 0, 0, 0, 0, 0);
     Stamped stamped("20240101");
+    OEDateTime longName(2024, 1, 31, 0, 0, 0, 0, 2, 0);
+    longName.SetTimeZone(std::string(200, 'Z').c_str(), 2, 0); // kept as given, written cut to three
     OEPayrollDateTime payrollEmpty, payroll;
     payrollEmpty.Assign("^@~*");
     payroll.Assign("20240102");
@@ -61,6 +63,7 @@ TEST(BuilderValuePaths, NumbersAndDatesOfEveryClassKeepTheirTextForm) {
         {[&](OEBuilder& b) { return b.AddAmount(wide); }, OEBS_OK, "123457159382712715937.0367\n"},
         {[&](OEBuilder& b) { return b.AddDateTime(plain); }, OEBS_OK, "20240131235959.999[-3.50:NST]\n"},
         {[&](OEBuilder& b) { return b.AddDateTime(midnight); }, OEBS_OK, "20240229\n"},
+        {[&](OEBuilder& b) { return b.AddDateTime(longName); }, OEBS_OK, "20240131000000.000[2:ZZZ]\n"},
         {[&](OEBuilder& b) { return b.AddDateTime(invalid); }, OEBS_NOTEXTFORM, ""},
         {[&](OEBuilder& b) { return b.AddDateTime(stamped); }, OEBS_OK, "STAMP\n"},
         {[&](OEBuilder& b) { return b.AddDateTime(payrollEmpty); }, OEBS_OK, "^@~*\n"},

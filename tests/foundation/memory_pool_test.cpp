@@ -124,14 +124,4 @@ TEST(MemoryPool, DataObjectsMadeOnOneThreadAreDeletedOnAnother) {
     delete plain;
 }
 
-TEST(MemoryPool, StringsMovedBetweenThreadsOutliveTheirMaker) {
-    std::vector<OEString> texts(500);
-    std::thread([&] {
-        for (std::size_t i = 0; i < texts.size(); ++i) texts[i] = OEString(std::to_string(i * 7919).c_str());
-    }).join();
-    for (std::size_t i = 0; i < texts.size(); ++i)
-        EXPECT_STREQ(texts[i].c_str(), std::to_string(i * 7919).c_str());
-    texts.clear();
-}
-
 } // namespace

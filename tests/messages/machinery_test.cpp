@@ -355,30 +355,3 @@ TEST(Machinery, RunningOutOfMemoryIsReportedNotFatal) {
 }
 
 } // namespace
-
-// A long list grows by steps that keep up with its length: few moves of the block, every entry
-// kept in order. (White-box: the list itself is protected.)
-struct ListProbe : OEBankTransactionList {
-    ListProbe() : OEBankTransactionList(1) {}
-    using OEAggregate::GetList;
-};
-
-TEST(Machinery, LongListsGrowInProportionToTheirLength) {
-    OEDataObjFactory* f = OEDataObj::GetFactory();
-    std::unique_ptr<ListProbe> list(new ListProbe);
-    const unsigned short kCount = 20000;
-    unsigned short capacity = 0, growths = 0;
-    for (unsigned short i = 0; i < kCount; ++i) {
-        OEBankStatementTx* tx = f->NewBankStatementTx(1);
-        tx->SetFITId(OEString(std::to_string(i).c_str()));
-        ASSERT_EQ(list->AppendStatementTx(tx), 1);
-        const unsigned short now = list->GetList(OETAG_STMTTRN)->Capacity();
-        if (now != capacity) ++growths;
-        capacity = now;
-    }
-    EXPECT_LT(growths, 40); // a fixed step of 512 would take 40
-    EXPECT_LE(capacity, kCount + kCount / 2);
-    ASSERT_EQ(list->GetNumStatementTx(), kCount);
-    for (unsigned short i = 0; i < kCount; i = static_cast<unsigned short>(i + 997))
-        EXPECT_STREQ(list->GetStatementTx(i)->GetFITId()->c_str(), std::to_string(i).c_str());
-}

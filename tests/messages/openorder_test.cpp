@@ -175,16 +175,7 @@ TEST(OpenOrder, RequiredElements) {
     }
 }
 
-TEST(OpenOrder, VersionsKindsAndBadValues) {
-    // SRVRTID and MEMO are version 1 only, SRVRTID2 and MEMO2 the others'.
-    for (unsigned short version : {1, 2}) {
-        std::unique_ptr<OEOO> oo(F()->NewOO(version));
-        unsigned short v1 = version == 1;
-        EXPECT_EQ(oo->SetMemo(OEString("m")), v1);
-        EXPECT_EQ(oo->SetMemo2(OEString("m")), !v1);
-        EXPECT_EQ(oo->SetServerTId(OEString("s")), v1);
-        EXPECT_EQ(oo->SetServerTId2(OEString("s")), !v1);
-    }
+TEST(OpenOrder, KindsAndBadValues) {
     // The shared accessors answer only for the kinds that have the element.
     std::unique_ptr<OEOOBuyStock> stock(F()->NewOOBuyStock(1));
     EXPECT_EQ(stock->SetUnitType(OEUT_SHARES), 0);
@@ -209,15 +200,6 @@ TEST(OpenOrder, VersionsKindsAndBadValues) {
     EXPECT_EQ(list->GetOpenOrder(0)->GetOO()->ValidateTag(OETAG_SUBACCT), 0);
     EXPECT_EQ(list->GetOpenOrder(0)->GetOO()->AllRequiredPresent(), 0);
     EXPECT_EQ(list->GetOpenOrder(6)->AllRequiredPresent(), 1);
-
-    // Appending and emptying.
-    std::unique_ptr<OEInvOOList> mine(F()->NewInvOOList(1));
-    EXPECT_EQ(mine->AppendOpenOrder(nullptr), 0);
-    EXPECT_EQ(mine->AppendOpenOrder(F()->NewOOSellDebt(1)), 1);
-    EXPECT_EQ(mine->ValidateTag(OETAG_OOSELLDEBT), 1);
-    mine->DeleteAllOpenOrder();
-    EXPECT_EQ(mine->GetNumOpenOrder(), 0);
-    EXPECT_EQ(mine->ValidateTag(OETAG_OOSELLDEBT), 0);
 }
 
 } // namespace
