@@ -1,4 +1,5 @@
 #include "foundation/oememory.h"
+#include "foundation/internal/oepool.h"
 
 #include "foundation/oethread.h"
 

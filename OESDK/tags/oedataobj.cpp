@@ -1,6 +1,7 @@
 #include "tags/oedataobj.h"
 
 #include "foundation/oememory.h"
+#include "foundation/internal/oepool.h"
 #include "foundation/oeparsewarning.h"
 #include "foundation/oethread.h"
 #include "parse/oeparser.h"
