@@ -35,8 +35,8 @@ OE_API void ReportFailure();
 // slab starts over whenever everything cut from it has been freed. Larger blocks come from the
 // heap. PoolAlloc's blocks are 16-byte aligned, PoolAllocBytes's (for text) 8-byte aligned. The
 // failure hook and the error code apply as to Malloc.
-// PoolFree takes only blocks of PoolAlloc or PoolAllocBytes (null is ignored). Under a sanitizer every block comes
-// from the heap, so that its checks see each block on its own.
+// PoolFree takes only blocks of PoolAlloc or PoolAllocBytes (null is ignored). Under a sanitizer every block
+// comes from the heap, so that its checks see each block on its own.
 enum : std::size_t { kPoolLargest = 1024 };
 OE_API void* PoolAlloc(std::size_t bytes);
 OE_API void* PoolAllocBytes(std::size_t bytes);
