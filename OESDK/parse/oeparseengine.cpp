@@ -196,8 +196,10 @@ const OETagDictionaryEntry* ResolveSlow(const char* name, unsigned short length)
 
 #if defined(__GNUC__)
 #define OE_ALWAYS_INLINE inline __attribute__((always_inline))
+#define OE_NOINLINE __attribute__((noinline))
 #else
 #define OE_ALWAYS_INLINE inline
+#define OE_NOINLINE
 #endif
 
 OE_ALWAYS_INLINE const OETagDictionaryEntry* OEParseEngine::Resolve(const RawToken& token) {
@@ -633,10 +635,184 @@ OE_ALWAYS_INLINE unsigned short OEParseEngine::ReadText(const RawToken& token) {
     return 1;
 }
 
+#ifdef OESDK_SCAN_SSE2
+namespace {
+inline __m128i Load16(const char* p) {
+    return _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+}
+inline unsigned MaskOf(__m128i v, char c) {
+    return static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_set1_epi8(c))));
+}
+inline unsigned SpaceMask(__m128i v) {
+    const __m128i s = _mm_or_si128(
+        _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8(' ')), _mm_cmpeq_epi8(v, _mm_set1_epi8('\n'))),
+        _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('\r')), _mm_cmpeq_epi8(v, _mm_set1_epi8('\t'))));
+    return static_cast<unsigned>(_mm_movemask_epi8(s));
+}
+// Bytes that never stand in a plain tag name: controls and space, "<", "/", and (as the signed
+// compare has it) every byte from 0x80, which the general scanner looks at instead.
+inline unsigned NameStopMask(__m128i v) {
+    const __m128i low = _mm_cmplt_epi8(v, _mm_set1_epi8(0x21));
+    const __m128i marks =
+        _mm_or_si128(_mm_cmpeq_epi8(v, _mm_set1_epi8('<')), _mm_cmpeq_epi8(v, _mm_set1_epi8('/')));
+    return static_cast<unsigned>(_mm_movemask_epi8(_mm_or_si128(low, marks)));
+}
+inline bool IsNameStart(char c) {
+    const char lower = static_cast<char>(c | 0x20);
+    return (lower >= 'a' && lower <= 'z') || (c >= '0' && c <= '9');
+}
+// n lowest bits set, for n from 0 to 16.
+inline unsigned LowBits(unsigned n) {
+    return (1u << n) - 1;
+}
+
+// "</NAME>" at `at` of the `size` bytes at `data` (where a "<" stands), NAME being the `length`
+// bytes of `name`, whose first 16 bytes are `nameBlock`.
+inline bool ClosesElement(const char* data, unsigned long size, unsigned long at, __m128i nameBlock,
+                          const char* name, unsigned short length) {
+    if (at + 3 + length > size || data[at + 1] != '/' || data[at + 2 + length] != '>') return false;
+    if (at + 18 > size) return SameBytes(data + at + 2, name, length);
+    const unsigned same =
+        static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(Load16(data + at + 2), nameBlock)));
+    return (same & LowBits(length)) == LowBits(length);
+}
+} // namespace
+
+// The element path in one pass over the bytes. It only takes what it can answer exactly as the
+// general path would: names found as written, values without NUL bytes, whitespace runs shorter
+// than 16 bytes, and at least 64 bytes of input left; everything else, and every case that logs,
+// is left untouched for the general path.
+OE_ALWAYS_INLINE int OEParseEngine::FastToken(const OETagDictionaryEntry*& entry) {
+    const char* base = m_data;
+    unsigned long p = m_pos;
+    if (p + 80 > m_size) return kNotFast;
+    {
+        const __m128i v = Load16(base + p);
+        const unsigned lt = MaskOf(v, '<');
+        if (!lt) return kNotFast;
+        const unsigned i = static_cast<unsigned>(__builtin_ctz(lt));
+        if ((SpaceMask(v) & LowBits(i)) != LowBits(i)) return kNotFast;
+        p += i;
+    }
+    // "<NAME>" or "</NAME>" with its ">" in the next 16 bytes.
+    const __m128i t = Load16(base + p + 1);
+    const unsigned gt = MaskOf(t, '>');
+    if (!gt) return kNotFast;
+    const unsigned g = static_cast<unsigned>(__builtin_ctz(gt));
+    const unsigned from = base[p + 1] == '/' ? 1u : 0u;
+    if (g <= from || (NameStopMask(t) & LowBits(g) & ~from) || !IsNameStart(base[p + 1 + from]))
+        return kNotFast;
+    const unsigned long nameStart = p + 1 + from;
+    const unsigned short nameLength = static_cast<unsigned short>(g - from);
+    const char* name = base + nameStart;
+    const unsigned long after = p + 2 + g; // past the ">", at most p + 17
+
+    if (from) {
+        const OETagDictionaryEntry* e = m_elementEntry;
+        if (!e || nameLength != m_elementNameLength ||
+            !SameBytes(name, base + m_elementNameStart, nameLength)) {
+            e = g_nameIndex->Find(name, nameLength, true);
+            if (!e) return kNotFast;
+            if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
+        }
+        m_elementEntry = nullptr;
+        m_tokenStart = p;
+        SyncOffset(p);
+        m_pos = after;
+        entry = e;
+        return OETK_ENDTAG;
+    }
+
+    const OETagDictionaryEntry* e = g_nameIndex->Find(name, nameLength, true);
+    if (!e) return kNotFast;
+    const char c = base[after];
+    if (c == '<' || IsSpace(c)) {
+        // A start tag right after (whitespace between): this one opens an aggregate. The next
+        // call scans that tag from its "<". End tags ("<MEMO></MEMO>"), comments, CDATA and
+        // processing instructions go the general way.
+        const __m128i w = Load16(base + after);
+        const unsigned lt = MaskOf(w, '<');
+        if (!lt) return kNotFast;
+        const unsigned k = static_cast<unsigned>(__builtin_ctz(lt));
+        if ((SpaceMask(w) & LowBits(k)) != LowBits(k) || !IsNameStart(base[after + k + 1])) return kNotFast;
+        m_elementEntry = nullptr;
+        if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
+        m_tokenStart = p;
+        SyncOffset(p);
+        m_pos = after + k;
+        entry = e;
+        return OETK_AGGSTART;
+    }
+
+    // An element: its value runs to the next "<", trailing whitespace not part of it.
+    unsigned long end = after;
+    unsigned amp = 0, nul = 0;
+    for (;;) {
+        if (end + 16 > m_size) return kNotFast;
+        const __m128i v = Load16(base + end);
+        const unsigned lt = MaskOf(v, '<');
+        const unsigned am = MaskOf(v, '&');
+        const unsigned zero =
+            static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(v, _mm_setzero_si128())));
+        if (lt) {
+            const unsigned i = static_cast<unsigned>(__builtin_ctz(lt));
+            amp |= am & LowBits(i);
+            nul |= zero & LowBits(i);
+            end += i;
+            break;
+        }
+        amp |= am;
+        nul |= zero;
+        end += 16;
+    }
+    if (nul || end - after > OEString::kMaxLength) return kNotFast;
+    unsigned long last = end;
+    while (IsSpace(base[last - 1])) --last; // stops at the value's first byte at the latest
+    const unsigned long length = last - after;
+    if (!m_value.SetRaw(base + after, length, true)) return kNotFast;
+    if (amp) {
+        char* text = m_value.LockBuffer(m_value.BufferSize());
+        if (!text) return kNotFast;
+        const unsigned long decoded = OEUtility::DecodeMacros(text, length);
+        text[decoded] = 0;
+        m_value.UnlockBuffer();
+    }
+    m_value.SetEncoding(OESE_PLAIN);
+    if (!m_unknownElement.IsEmpty()) m_unknownElement.Assign("", 0);
+    m_tokenStart = p;
+    SyncOffset(p);
+    m_pos = end;
+    entry = e;
+    // "</NAME>" with the very bytes of the start tag's name, right after the value.
+    if (m_skipElementEnd && ClosesElement(base, m_size, end, t, name, nameLength)) {
+        m_pos = end + 3 + nameLength;
+        m_elementEntry = nullptr;
+        m_elementClosed = true;
+        return OETK_ELEMENT;
+    }
+    m_elementEntry = e;
+    m_elementNameStart = nameStart;
+    m_elementNameLength = nameLength;
+    return OETK_ELEMENT;
+}
+#endif
+
 int OEParseEngine::GetNextToken(const OETagDictionaryEntry*& entry) {
     entry = nullptr;
     m_lastStartEmpty = false;
     m_elementClosed = false;
+#ifdef OESDK_SCAN_SSE2
+    if (!m_haveLookAhead && m_fastScan) {
+        const int kind = FastToken(entry);
+        if (kind != kNotFast) return kind;
+    }
+#endif
+    return GeneralToken(entry);
+}
+
+// Every token the fast path leaves: scanned into raw tokens, with a look-ahead token to tell
+// an element from an aggregate.
+OE_NOINLINE int OEParseEngine::GeneralToken(const OETagDictionaryEntry*& entry) {
     for (;;) {
         RawToken token;
         if (m_haveLookAhead) {

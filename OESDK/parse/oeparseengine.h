@@ -71,6 +71,11 @@ public:
     // only pass over that end tag.
     void SetSkipElementEndTags(bool skip) { m_skipElementEnd = skip; }
     bool GetSkipElementEndTags() const { return m_skipElementEnd; }
+    // The common tokens ("<NAME>value", "</NAME>", an aggregate's start tag) are read in one
+    // pass over the bytes; everything else goes through the general scanner, which gives the same
+    // tokens, values and log entries. Off sends every token the general way (for checking the two
+    // against each other, or for narrowing down a tokenizer problem). On by default.
+    void SetFastScan(bool on) { m_fastScan = on; }
     // 1 when the element just returned had its end tag consumed with it.
     unsigned short LastElementClosed() const { return m_elementClosed ? 1 : 0; }
 
@@ -78,7 +83,8 @@ public:
     // or 0 when such a line has no end.
     unsigned short SkipBoundaryLine();
 
-    // The input offset the scanner stands at (also kept in the buffer's offset for the log).
+    // The input offset scanning goes on from. (The buffer's offset, for the log, is the start of the
+    // token last returned.)
     unsigned long GetOffset() const { return m_pos; }
 
     // Resolves a tag name: exact first, then ignoring case (logging OEPW_LOWERCASE with the name
@@ -104,6 +110,11 @@ private:
         unsigned short SetRaw(const char* text, unsigned long n, bool canOverRead);
     };
 
+    // The common tokens in one pass: "<NAME>value", "</NAME>", and "<NAME>" followed by another
+    // start tag. Returns the token kind, or kNotFast (nothing changed) for anything else.
+    enum { kNotFast = -2 };
+    OE_INTERNAL int FastToken(const OETagDictionaryEntry*& entry);
+    OE_INTERNAL int GeneralToken(const OETagDictionaryEntry*& entry);
     OE_INTERNAL void ScanRaw(RawToken& token);
     OE_INTERNAL void ScanFast(RawToken& token);
     OE_INTERNAL bool ScanShortTag(unsigned long p, RawToken& token) const;
@@ -130,6 +141,7 @@ private:
     bool m_lastStartEmpty;
     bool m_skipElementEnd = false;
     bool m_elementClosed = false;
+    bool m_fastScan = true;
     ValueText m_value;
     // The name of the last unknown element, whose end tag is dropped with it.
     OEString m_unknownElement;
