@@ -109,18 +109,6 @@ TEST(Envelope, DeepCopyClearsTheResponseMarkNotSonrq) {
     EXPECT_EQ(BuildText(target.get()), BuildText(source.get()));
 }
 
-TEST(Envelope, MessageSetVersionComesFromTheWrapperTag) {
-    struct Row {
-        OETagID tag;
-        unsigned short version;
-    };
-    for (Row r : {Row{OETAG_BANKMSGSRQV2, 2}, Row{OETAG_K_EFILEMSGSRQV1, 1}, Row{OETAG_BANKMSGSRQV1, 1},
-                  Row{OETAG_STMTRQ, 0}}) {
-        std::unique_ptr<OEMessageSetRq> set(Set(r.tag));
-        EXPECT_EQ(set->GetMsgSetVersion(), r.version) << r.tag;
-    }
-}
-
 TEST(Envelope, InnerRequestMaps) {
     struct Row {
         OETagID inner, msgSet, wrapper, sync;

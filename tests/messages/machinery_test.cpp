@@ -296,31 +296,6 @@ int FailAfter(std::size_t) {
     return g_remaining-- > 0 ? 0 : 1;
 }
 
-// Enumeration elements go through the builder's own value writers: a builder that overrides one
-// changes that element wherever it stands, and only it; the end-tag form is kept.
-class ShoutingTxType : public OEBuilder {
-public:
-    ShoutingTxType() : OEBuilder(OEBCL_LF, 1) {}
-    OEBuildStatus AddBankTxType(OEBankTxType value) override {
-        OEBuildStatus s = OEBuilder::AddBankTxType(value);
-        if (s == OEBS_OK) GetBuffer()->WriteLarge("!\n", 2);
-        return s;
-    }
-};
-
-TEST(Machinery, EnumerationElementsUseTheBuildersValueWriters) {
-    std::unique_ptr<OEFileRs> file(F()->NewFileRs(1));
-    ASSERT_EQ(ParseInto(kOneStatement, file.get()), OEPS_OK);
-    OEBuffer buffer(0, 4096);
-    ShoutingTxType builder;
-    ASSERT_EQ(builder.Build(&buffer, file->GetResponse(0), OEBSO_STRICT, 0, 0), OEBS_OK);
-    std::string text(buffer.GetBufferPtr(), buffer.GetBufferSize());
-    EXPECT_NE(text.find("<TRNTYPE>PAYMENT\n!\n</TRNTYPE>\n"), std::string::npos) << text;
-    EXPECT_NE(text.find("<TRNTYPE>FEE\n!\n</TRNTYPE>\n"), std::string::npos);
-    EXPECT_NE(text.find("<SEVERITY>INFO\n</SEVERITY>\n"), std::string::npos)
-        << "other enumerations as before";
-}
-
 TEST(Machinery, RunningOutOfMemoryIsReportedNotFatal) {
     std::string text(kOneStatement);
     // Fail the n-th allocation for a range of n: every parse ends with a status, never a crash.
