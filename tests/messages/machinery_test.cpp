@@ -183,27 +183,6 @@ TEST(Machinery, DeepCopiesOfSetsSyncsAndWrappersOnBothSides) {
     EXPECT_EQ(mixed->GetNumberOfRequest(), 0);
 }
 
-TEST(Machinery, RequestFilesRoundTrip) {
-    const char* text =
-        "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n<OFX><SIGNONMSGSRQV1><SONRQ><DTCLIENT>20240105"
-        "<USERID>u<USERPASS>pw<LANGUAGE>ENG<APPID>QWIN<APPVER>2700</SONRQ></SIGNONMSGSRQV1>"
-        "<BANKMSGSRQV1><STMTTRNRQ><TRNUID>1<STMTRQ><BANKACCTFROM><BANKID>1<ACCTID>2<ACCTTYPE>SAVINGS"
-        "</BANKACCTFROM><INCTRAN><INCLUDE>N</INCTRAN></STMTRQ></STMTTRNRQ></BANKMSGSRQV1></OFX>";
-    std::unique_ptr<OEFileRq> file(F()->NewFileRq(0));
-    ASSERT_EQ(ParseInto(text, file.get(), 1), OEPS_OK);
-    OEMessageSetRq* bank = file->GetRequest(0)->GetMessageSet(1);
-    ASSERT_NE(bank, nullptr);
-    EXPECT_EQ(bank->GetTrans(0)->GetMsgsRqTag(), OETAG_BANKMSGSRQV1);
-    std::string built = BuildText(file.get());
-    std::unique_ptr<OEFileRq> again(F()->NewFileRq(0));
-    ASSERT_EQ(ParseInto(built, again.get(), 1), OEPS_OK);
-    EXPECT_EQ(BuildText(again.get()), built);
-    bool masked = true;
-    for (unsigned short i = 0; i < LogCount(); ++i)
-        if (std::string(LogEntry(i)->GetText().c_str()).find("pw") != std::string::npos) masked = false;
-    EXPECT_TRUE(masked);
-}
-
 // A host factory: every parsed transaction comes out as the host's own class.
 class HostTx : public OEBankStatementTx {
 public:
