@@ -10,10 +10,6 @@ using namespace msgtest;
 
 namespace {
 
-OEDataObjFactory* F() {
-    return OEDataObj::GetFactory();
-}
-
 OEMessageSetRq* Set(OETagID tag) {
     OEMessageSetRq* set = F()->NewMessageSetRq(1);
     set->SetType(tag);

@@ -13,10 +13,6 @@ using namespace msgtest;
 
 namespace {
 
-OEDataObjFactory* F() {
-    return OEDataObj::GetFactory();
-}
-
 const char kOneStatement[] =
     "OFXHEADER:100\nDATA:OFXSGML\nVERSION:102\n\n<OFX><SIGNONMSGSRSV1><SONRS><STATUS><CODE>0<SEVERITY>INFO</"
     "STATUS>"
