@@ -62,8 +62,7 @@ TEST(Machinery, ElementKindsConvertOrLogAndStayUnset) {
     std::unique_ptr<OEBankStatementTx> tx(F()->NewBankStatementTx(1));
     OETagDictionaryEntry unknown{OETAG_BALAMT, "BALAMT"};
     EXPECT_EQ(tx->HandleTagElement(&unknown, OEString("1")), OEPS_INVALID);
-    OEString whole;
-    tx->SetCheckNum(OEString("1234567890123"));
+    tx->SetCheckNum(OEString("1234567890123")); // the setter keeps a long value whole too
     EXPECT_STREQ(tx->GetCheckNum()->c_str(), "1234567890123");
 
     std::unique_ptr<OEIncTransaction> inc(F()->NewIncTransaction(1));
