@@ -188,7 +188,7 @@ TEST(Statement, TransactionTypeKeywordsMatchIgnoringCaseOnly) {
     }
 }
 
-TEST(Statement, TransactionRulesAndBuildOrder) {
+TEST(Statement, TransactionRules) {
     OEDataObjFactory* f = OEDataObj::GetFactory();
     std::unique_ptr<OEBankStatementTx> tx(f->NewBankStatementTx(1));
     EXPECT_EQ(tx->SetTxType(OEString("DIRECT DEBIT")), 0); // a blank inside the word is refused
@@ -196,25 +196,19 @@ TEST(Statement, TransactionRulesAndBuildOrder) {
     tx->SetDateTimePosted(OEString("20240102"));
     tx->SetTxAmount(OEString("-1.5"));
     tx->SetFITId(OEString("F"));
-    EXPECT_EQ(tx->AllRequiredPresent(), 1);
-    tx->SetMemo(OEString("m"));
-    tx->SetCurrency(f->NewCurrency(1));
-    static_cast<OECurrency*>(tx->GetCurrency())->SetCurrencySymbol(OEString("EUR"));
-    static_cast<OECurrency*>(tx->GetCurrency())->SetCurrencyRate(OEString("1.1"));
     tx->SetName(OEString("n"));
     EXPECT_EQ(tx->AllRequiredPresent(), 1);
-    OEPayee* payee = f->NewPayee(1);
-    tx->SetPayee(payee);
+    tx->SetPayee(f->NewPayee(1));
     EXPECT_EQ(tx->AllRequiredPresent(), 0) << "NAME together with PAYEE";
-    tx->SetPayee(nullptr);
     OEBankAccount* to = f->NewBankAccount(1);
     tx->SetAccountTo(to);
-    EXPECT_EQ(to->GetType(), OETAG_BANKACCTTO);
-    // The currency comes last, after MEMO; the account after NAME.
-    EXPECT_EQ(
-        BuildText(tx.get()),
-        "<TRNTYPE>CHECK\n<DTPOSTED>20240102\n<TRNAMT>-1.5\n<FITID>F\n<NAME>n\n<BANKACCTTO>\n</BANKACCTTO>\n"
-        "<MEMO>m\n<CURRENCY>\n<CURRATE>1.1\n<CURSYM>EUR\n</CURRENCY>\n");
+    EXPECT_EQ(to->GetType(), OETAG_BANKACCTTO) << "the slot names the account";
+    OECurrency* orig = f->NewCurrency(1);
+    orig->SetType(OETAG_ORIGCURRENCY);
+    EXPECT_EQ(orig->SetCurrencySymbol(OEString("")), 3) << "an empty symbol marks nothing";
+    EXPECT_EQ(orig->ValidateTag(OETAG_CURSYM), 0);
+    tx->SetCurrency(orig);
+    EXPECT_EQ(tx->ValidateTag(OETAG_ORIGCURRENCY), 1) << "the currency's own tag picks the element";
 }
 
 } // namespace
