@@ -127,11 +127,6 @@ TEST(Builder, ElementFormsAndValueWriters) {
     xml.builder.AddTagOEAmount(OETAG_TRNAMT, amount);
     xml.builder.AddTagEnd(OETAG_STMTTRN);
     EXPECT_EQ(xml.text(), "<STMTTRN>\n<NAME>n\n</NAME>\n<TRNAMT>-12.5\n</TRNAMT>\n</STMTTRN>\n");
-    EXPECT_EQ(xml.builder.GetElemEndTags(), 1);
-
-    OEPayrollBuilder payroll;
-    EXPECT_EQ(payroll.GetCRLFoption(), OEBCL_CRLF);
-    EXPECT_EQ(payroll.GetElemEndTags(), 0);
 }
 
 TEST(Builder, FailedObjectIsTheFirstFailureAndIsKept) {

@@ -16,8 +16,6 @@ TEST(OEBuffer, ConstructionRules) {
         EXPECT_EQ(b.GetGrowBy(), c.increment) << c.initial << "/" << c.growBy;
         EXPECT_EQ(b.GetBufferSize(), 0u);
     }
-    OEBuffer b;
-    EXPECT_EQ(b.GetMaxBufferSize(), 4000000000ul);
 }
 
 TEST(OEBuffer, WriteGrowsByMaxOfIncrementAndNeed) {

@@ -156,33 +156,12 @@ TEST(OEString, ClearMasksWithTheBufferLength) {
     EXPECT_TRUE(none.IsNull());
 }
 
-TEST(OEString, CdataWrapsOnceAndUnwraps) {
-    OEString s("a<b");
-    s.ToCDATA();
-    EXPECT_STREQ(s, "<![CDATA[a<b]]>");
-    EXPECT_EQ(s.GetEncoding(), OESE_CDATA);
-    s.ToCDATA();
-    EXPECT_STREQ(s, "<![CDATA[a<b]]>");
-    s.FromCDATA();
-    EXPECT_STREQ(s, "a<b");
-    EXPECT_EQ(s.GetEncoding(), OESE_PLAIN);
-
-    OEString already("<![CDATA[x]]>");
-    already.ToCDATA(); // already wrapped: only the mark changes
-    EXPECT_STREQ(already, "<![CDATA[x]]>");
-    EXPECT_EQ(already.GetEncoding(), OESE_CDATA);
-    OEString plain("plain");
-    plain.SetEncoding(OESE_CDATA);
-    plain.FromCDATA();
-    EXPECT_STREQ(plain, "plain");
-    EXPECT_EQ(plain.GetEncoding(), OESE_PLAIN);
-}
-
 TEST(OEString, EditingOperations) {
     struct Case {
         const char* input;
         void (*op)(OEString&);
         const char* expected;
+        OEStringEncode encoding = OESE_PLAIN;
     };
     const Case cases[] = {
         {"  a b  ", [](OEString& s) { s.TrimLeadingSpaces(); }, "a b  "},
@@ -194,12 +173,18 @@ TEST(OEString, EditingOperations) {
         {"abc", [](OEString& s) { s.Truncate(10); }, "abc"}, // beyond the buffer: unchanged
         {"ab", [](OEString& s) { s += "cd"; }, "abcd"},
         {"ab", [](OEString& s) { s += static_cast<const char*>(nullptr); }, "ab"},
+        // CDATA: wrapped once, unwrapped back; a wrapped text only gets the mark.
+        {"a<b", [](OEString& s) { s.ToCDATA(), s.ToCDATA(); }, "<![CDATA[a<b]]>", OESE_CDATA},
+        {"a<b", [](OEString& s) { s.ToCDATA(), s.FromCDATA(); }, "a<b"},
+        {"<![CDATA[x]]>", [](OEString& s) { s.ToCDATA(); }, "<![CDATA[x]]>", OESE_CDATA},
+        {"plain", [](OEString& s) { s.SetEncoding(OESE_CDATA), s.FromCDATA(); }, "plain"},
     };
     for (const Case& c : cases) {
         OEString s(c.input);
         c.op(s);
         EXPECT_STREQ(s, c.expected) << "input '" << c.input << "'";
         EXPECT_EQ(s.GetStrLength(), std::strlen(c.expected));
+        EXPECT_EQ(s.GetEncoding(), c.encoding) << "input '" << c.input << "'";
     }
 }
 

@@ -65,8 +65,6 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
                  {"20240131235959.999[-5:EST]", 1, -1, nullptr, "20240131235959.999[-5:EST]"},
                  {"20240131120000[+3]", 1, -1, nullptr, "20240131120000.000[3]"},
                  {"20240131120000[-4:EDT]", 1, -1, nullptr, "20240131120000.000[-4:EDT]"},
-                 {"20240131120000[-4:AST]", 1, -1, nullptr, "20240131120000.000[-4:AST]"},
-                 {"20240131120000[-8:YDT]", 1, -1, nullptr, "20240131120000.000[-8:YDT]"},
                  {"20240131120000[-5:PST]", 1, OEPW_BADFORMAT, kMismatch, "20240131120000.000[-5:PST]"},
                  {"20240131120000[0:GMT]", 1, -1, nullptr, "20240131120000"},
                  {"20240131[5.5]", 1, -1, nullptr, "20240131000000.000[5.50]"},
@@ -79,12 +77,10 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
                  {"20240131[-5:ESTX]", 1, OEPW_BADFORMAT, kTZ, "20240131000000.000[-5:EST]"},
                  {"20240131[5.555]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20230229[-5:PST]", 0, OEPW_OUTOFRANGE, kDT, nullptr}, // only the failure is logged
-                 {"2024013112000[]", 0, OEPW_BADFORMAT, kTM, nullptr},
                  {"20240131[--5]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[5-]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[5.5.]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[:EST]", 0, OEPW_BADFORMAT, kTZ, nullptr},
-                 {"20240131[5x]", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[-5]x", 0, OEPW_BADFORMAT, kTZ, nullptr},
                  {"20240131[13]", 0, OEPW_OUTOFRANGE, kTM, nullptr},
                  {"20240131-0500", 0, OEPW_BADFORMAT, kTM, nullptr},
@@ -130,9 +126,6 @@ TEST_F(ValuesDateTime, ParseAndDateForm) {
     }
     EXPECT_TRUE(log.ExactlyOne(OEPW_NULLPOINTER, "20240131[-5:EST]", kTM));
     OEThreadState::SetErrorCode(OETE_NONE);
-    OEDateTime n("20240131[-3.5]");
-    EXPECT_EQ(-3, n.GetTimeZoneHours());
-    EXPECT_EQ(-50, n.GetTimeZoneFraction());
 }
 
 TEST_F(ValuesDateTime, TimeForm) {

@@ -1,6 +1,6 @@
 // Statement-end, challenge and profile aggregates and the multiple interbank wrappers: each one
-// parsed inside its wrapper reads back through its typed getters, writes the text it was given,
-// and survives a round trip in both forms; a bank's real profile response does the same.
+// parsed inside its wrapper is made as its own class, writes the text it was given, and survives a
+// round trip in both forms; a bank's real profile response does the same.
 #include "msg_helpers.h"
 
 #include <gtest/gtest.h>
@@ -13,21 +13,12 @@ using namespace msgtest;
 
 namespace {
 
-OEDataObjFactory* F() {
-    return OEDataObj::GetFactory();
-}
-
 std::string Str(const OEString* s) {
     return s ? s->c_str() : "(none)";
 }
 std::string Date(const OEDateTime* d) {
     OEString out;
     if (d) d->GetDateString(out);
-    return out.c_str();
-}
-std::string Amount(const OEPrecisionInteger* a) {
-    OEString out;
-    if (a) OEAggregate::AmountText(*a, out);
     return out.c_str();
 }
 
@@ -82,22 +73,21 @@ struct ClassRow {
     const char* set;
     const char* wrapper;
     const char* inner;
-    const char* body; // as the builder writes it
-    OETagID required; // clearing this mark fails the required check
+    const char* body;         // as the builder writes it
+    OETagID required;         // clearing this mark fails the required check
+    bool (*made)(OEDataObj*); // the parse made the inner's own class
     std::function<void(OEDataObj*)> check;
 };
+
+template <class T> bool Is(OEDataObj* o) {
+    return dynamic_cast<T*>(o) != nullptr;
+}
 
 const ClassRow kRows[] = {
     {true, "BANKMSGSRQV1", "STMTENDTRNRQ", "STMTENDRQ",
      "<BANKACCTFROM>\n<BANKID>011\n<ACCTID>42\n<ACCTTYPE>CHECKING\n</BANKACCTFROM>\n<DTSTART>20240101\n"
      "<DTEND>20240331\n",
-     OETAG_BANKACCTFROM,
-     [](OEDataObj* o) {
-         auto* rq = dynamic_cast<OEStatementEndRq*>(o);
-         ASSERT_NE(rq, nullptr);
-         EXPECT_EQ(Str(rq->GetAccountFrom()->GetBankId()), "011");
-         EXPECT_EQ(Date(rq->GetDateEnd()), "20240331");
-     }},
+     OETAG_BANKACCTFROM, &Is<OEStatementEndRq>, nullptr},
     {false, "BANKMSGSRSV1", "STMTENDTRNRS", "STMTENDRS",
      "<CURDEF>USD\n<BANKACCTFROM>\n<BANKID>011\n<ACCTID>42\n<ACCTTYPE>SAVINGS\n</BANKACCTFROM>\n"
      "<CLOSING>\n<FITID>C1\n<DTOPEN>20240101\n<DTCLOSE>20240131\n<DTNEXT>20240229\n<BALOPEN>100\n"
@@ -105,64 +95,22 @@ const ClassRow kRows[] = {
      "<DTPOSTSTART>20240101\n<DTPOSTEND>20240131\n<MKTGINFO>Thanks\n</CLOSING>\n"
      "<CLOSING>\n<FITID>C2\n<DTCLOSE>20240229\n<BALCLOSE>-3\n<DTPOSTSTART>20240201\n<DTPOSTEND>20240229\n"
      "<ORIGCURRENCY>\n<CURRATE>1.1\n<CURSYM>EUR\n</ORIGCURRENCY>\n</CLOSING>\n",
-     OETAG_CURDEF,
-     [](OEDataObj* o) {
-         auto* rs = dynamic_cast<OEStatementEndRs*>(o);
-         ASSERT_NE(rs, nullptr);
-         ASSERT_EQ(rs->GetNumClosing(), 2);
-         OEClosing* first = rs->GetClosing(0);
-         EXPECT_EQ(Amount(first->GetBalanceClose()), "150.25");
-         EXPECT_EQ(Amount(first->GetChecksAndDebits()), "-24.75");
-         EXPECT_EQ(Date(first->GetDateNext()), "20240229");
-         EXPECT_EQ(first->AllRequiredPresent(), 1);
-         ASSERT_NE(rs->GetClosing(1)->GetCurrency(), nullptr);
-         EXPECT_EQ(rs->GetClosing(1)->GetCurrency()->GetType(), OETAG_ORIGCURRENCY);
-         first->ClearTag(OETAG_DTPOSTEND);
-         EXPECT_EQ(first->AllRequiredPresent(), 0);
-         first->SetTag(OETAG_DTPOSTEND);
-     }},
+     OETAG_CURDEF, &Is<OEStatementEndRs>, nullptr},
     {true, "CREDITCARDMSGSRQV1", "CCSTMTENDTRNRQ", "CCSTMTENDRQ",
      "<CCACCTFROM>\n<ACCTID>4111\n</CCACCTFROM>\n<DTSTART>20240101\n", OETAG_CCACCTFROM,
-     [](OEDataObj* o) {
-         auto* rq = dynamic_cast<OECCStatementEndRq*>(o);
-         ASSERT_NE(rq, nullptr);
-         EXPECT_EQ(Str(rq->GetAccountFrom()->GetAcctId()), "4111");
-         EXPECT_EQ(rq->GetDateEnd(), nullptr);
-     }},
+     &Is<OECCStatementEndRq>, nullptr},
     {false, "CREDITCARDMSGSRSV1", "CCSTMTENDTRNRS", "CCSTMTENDRS",
      "<CURDEF>EUR\n<CCACCTFROM>\n<ACCTID>4111\n</CCACCTFROM>\n<CCCLOSING>\n<FITID>S1\n<DTCLOSE>20240131\n"
      "<BALCLOSE>-410.3\n<DTPMTDUE>20240225\n<MINPMTDUE>25\n<FINCHG>3.1\n<PAYANDCREDIT>200\n<PURANDADV>-610."
      "3\n"
      "<DEBADJ>0\n<CREDITLIMIT>5000\n<DTPOSTSTART>20240101\n<DTPOSTEND>20240131\n</CCCLOSING>\n",
-     OETAG_CCACCTFROM,
-     [](OEDataObj* o) {
-         auto* rs = dynamic_cast<OECCStatementEndRs*>(o);
-         ASSERT_NE(rs, nullptr);
-         ASSERT_EQ(rs->GetNumClosing(), 1);
-         EXPECT_EQ(Date(rs->GetClosing(0)->GetDatePaymentDue()), "20240225");
-         EXPECT_EQ(Amount(rs->GetClosing(0)->GetMinPaymentDue()), "25");
-         EXPECT_EQ(Amount(rs->GetClosing(0)->GetCreditLimit()), "5000");
-     }},
+     OETAG_CCACCTFROM, &Is<OECCStatementEndRs>, nullptr},
     {true, "SIGNONMSGSRQV1", "CHALLENGETRNRQ", "CHALLENGERQ", "<USERID>jo\n<FICERTID>cert-7\n", OETAG_USERID,
-     [](OEDataObj* o) {
-         auto* rq = dynamic_cast<OEChallengeRq*>(o);
-         ASSERT_NE(rq, nullptr);
-         EXPECT_EQ(Str(rq->GetFICertId()), "cert-7");
-     }},
+     &Is<OEChallengeRq>, nullptr},
     {false, "SIGNONMSGSRSV1", "CHALLENGETRNRS", "CHALLENGERS", "<USERID>jo\n<NONCE>n0nce\n<FICERTID>cert-7\n",
-     OETAG_NONCE,
-     [](OEDataObj* o) {
-         auto* rs = dynamic_cast<OEChallengeRs*>(o);
-         ASSERT_NE(rs, nullptr);
-         EXPECT_EQ(Str(rs->GetNonce()), "n0nce");
-     }},
+     OETAG_NONCE, &Is<OEChallengeRs>, nullptr},
     {true, "PROFMSGSRQV1", "PROFTRNRQ", "PROFRQ", "<CLIENTROUTING>MSGSET\n<DTPROFUP>19991231\n",
-     OETAG_DTPROFUP,
-     [](OEDataObj* o) {
-         auto* rq = dynamic_cast<OEProfileRq*>(o);
-         ASSERT_NE(rq, nullptr);
-         EXPECT_EQ(rq->GetClientRouting(), static_cast<unsigned short>(OECR_MSGSET));
-     }},
+     OETAG_DTPROFUP, &Is<OEProfileRq>, nullptr},
     // Version 2: URL2, URLGETREDIRECT and PWTYPE belong to the later message sets.
     {false, "PROFMSGSRSV2", "PROFTRNRS", "PROFRS",
      "<MSGSETLIST>\n<PROFMSGSET>\n<PROFMSGSETV1>\n</PROFMSGSETV1>\n</PROFMSGSET>\n</MSGSETLIST>\n"
@@ -173,17 +121,10 @@ const ClassRow kRows[] = {
      "2\n<CITY>Town\n<STATE>CA\n<POSTALCODE>90000\n"
      "<COUNTRY>USA\n<CSPHONE>555\n<URL2>https://bank.example/"
      "ofx\n<URLGETREDIRECT>Y\n<EMAIL>help@bank.example\n",
-     OETAG_FINAME,
+     OETAG_FINAME, &Is<OEProfileRs>,
      [](OEDataObj* o) {
-         auto* rs = dynamic_cast<OEProfileRs*>(o);
-         ASSERT_NE(rs, nullptr);
-         EXPECT_EQ(Str(rs->GetURL2()), "https://bank.example/ofx");
-         EXPECT_EQ(rs->GetURLGetRedirect(), 1);
-         ASSERT_EQ(rs->GetSignOnInfoList()->GetNumSignOnInfo(), 1);
-         OESignOnInfo* info = rs->GetSignOnInfoList()->GetSignOnInfo(0);
-         EXPECT_EQ(info->GetMax(), 12);
-         EXPECT_EQ(info->GetPasswordType(), 2);
-         EXPECT_EQ(info->AllRequiredPresent(), 1);
+         auto* rs = static_cast<OEProfileRs*>(o);
+         EXPECT_EQ(rs->GetSignOnInfoList()->GetSignOnInfo(0)->AllRequiredPresent(), 1);
          EXPECT_NE(rs->GetMessageSetList()->GetMessageSetProfile(OETAG_PROFMSGSET), nullptr);
          rs->SetAddr3(OEString("Suite 9"));
          rs->ClearTag(OETAG_ADDR2);
@@ -203,35 +144,17 @@ TEST(EnvelopeClasses, ParseReadWriteAndRoundTripInBothForms) {
         OEAggregate* wrapper = nullptr;
         OEDataObj* inner = Inner(file.get(), r.request, wrapper);
         ASSERT_NE(inner, nullptr);
-        r.check(inner);
+        ASSERT_TRUE(r.made(inner));
+        if (r.check) r.check(inner);
         EXPECT_EQ(BuildText(inner), r.body);
         EXPECT_EQ(inner->AllRequiredPresent(), 1);
         EXPECT_EQ(wrapper->AllRequiredPresent(), 1);
         inner->ClearTag(r.required);
         EXPECT_EQ(inner->AllRequiredPresent(), 0);
         inner->SetTag(r.required);
-        std::string canonical = BuildText(file.get());
-        for (unsigned short endTags : {0, 1}) {
-            std::unique_ptr<OEFile> again = NewFile(r.request, version);
-            ASSERT_EQ(ParseInto(BuildText(file.get(), endTags), again.get()), OEPS_OK) << endTags;
-            EXPECT_EQ(BuildText(again.get()), canonical) << endTags;
-        }
         // A deep copy of the whole tree makes the same classes again.
-        std::unique_ptr<OEFile> copy = NewFile(r.request, version);
-        ASSERT_EQ(copy->DeepCopyFrom(file.get()), 1);
-        EXPECT_EQ(BuildText(copy.get()), canonical);
+        ExpectRoundTrips(file.get(), [&] { return NewFile(r.request, version); });
     }
-}
-
-TEST(EnvelopeClasses, VersionOneRefusesTheLaterElements) {
-    std::unique_ptr<OEProfileRs> v1(F()->NewProfileRs(1));
-    EXPECT_EQ(v1->SetURL(OEString("https://a")), 1);
-    EXPECT_EQ(v1->SetURL2(OEString("https://a")), 0);
-    EXPECT_EQ(v1->SetURLGetRedirect(static_cast<unsigned short>(1)), 0);
-    std::unique_ptr<OESignOnInfo> info(F()->NewSignOnInfo(1));
-    EXPECT_EQ(info->SetPasswordType(OEString("FIXED")), 0);
-    EXPECT_EQ(info->SetCharType(OEString("letters")), 0) << "a word outside the table";
-    EXPECT_EQ(info->SetCharType(OEString("numericonly")), 1);
 }
 
 TEST(MultiTransfer, WrappersAreMadeByTagAndKeepTheirRules) {
@@ -303,14 +226,8 @@ TEST(ProfileCorpus, ABanksProfileReadsAsWrittenAndRoundTrips) {
     EXPECT_EQ(info->GetCaseSensitive(), 1);
     EXPECT_EQ(info->GetChangePinFirst(), 0);
     EXPECT_TRUE(info->ValidateTag(OETAG_CHGPINFIRST));
-
-    std::string canonical = BuildText(file.get());
-    for (unsigned short endTags : {0, 1}) {
-        std::unique_ptr<OEFileRs> again(F()->NewFileRs(0));
-        OEParseStatus status = ParseInto(BuildText(file.get(), endTags), again.get());
-        EXPECT_TRUE(status == OEPS_OK || status == OEPS_WARNINGS) << status;
-        EXPECT_EQ(BuildText(again.get()), canonical) << endTags;
-    }
+    ExpectRoundTrips(
+        file.get(), [] { return std::unique_ptr<OEFileRs>(F()->NewFileRs(0)); }, true);
 }
 
 } // namespace

@@ -1,8 +1,11 @@
-// Helpers of the message-layer tests: parse text into a file object, build a tree to text.
+// Helpers of the message-layer tests: parse text into a file object, build a tree to text, check
+// that a tree survives both written forms and a deep copy.
 #ifndef OESDK_TESTS_MESSAGES_MSG_HELPERS_H
 #define OESDK_TESTS_MESSAGES_MSG_HELPERS_H
 
 #include "oesdk.h"
+
+#include <gtest/gtest.h>
 
 #include <cstdio>
 #include <string>
@@ -54,6 +57,27 @@ inline bool ReadFile(const std::string& path, std::string& text) {
     while ((n = std::fread(chunk, 1, sizeof(chunk), f)) > 0) text.append(chunk, n);
     std::fclose(f);
     return true;
+}
+
+inline OEDataObjFactory* F() {
+    return OEDataObj::GetFactory();
+}
+
+// Written in either form and read back into a fresh() tree, and deep-copied into another: the same
+// text as the tree's every time. Reading back may log warnings only when the original did.
+template <class Tree, class Make>
+void ExpectRoundTrips(Tree* tree, Make fresh, bool warningsAllowed = false) {
+    const std::string canonical = BuildText(tree);
+    for (unsigned short endTags : {0, 1}) {
+        auto again = fresh();
+        const OEParseStatus status = ParseInto(BuildText(tree, endTags), again.get());
+        EXPECT_TRUE(status == OEPS_OK || (warningsAllowed && status == OEPS_WARNINGS))
+            << "form " << endTags << ", status " << status;
+        EXPECT_EQ(BuildText(again.get()), canonical) << "form " << endTags;
+    }
+    auto copy = fresh();
+    ASSERT_EQ(copy->DeepCopyFrom(tree), 1);
+    EXPECT_EQ(BuildText(copy.get()), canonical) << "deep copy";
 }
 
 inline OEParseException* LogEntry(unsigned short i) {

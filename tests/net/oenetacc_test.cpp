@@ -143,19 +143,6 @@ TEST(LocalAccess, CallbacksAndDefaults) {
     EXPECT_EQ(g_op, OEOpProgress);
     EXPECT_EQ(g_done, 10u);
     EXPECT_EQ(g_total, 20u);
-    EXPECT_EQ(access.IsNetworkSetup(), 1);
-    EXPECT_EQ(access.InitConnection(), OENetOK);
-
-    struct Peek : LocalAccess {
-        std::string Agent() const { return GetAgentName().c_str(); }
-        std::string Temp() const { return GetTempFilePath().c_str(); }
-    } peek;
-    EXPECT_EQ(peek.Agent(), "NONAME");
-    EXPECT_EQ(peek.Temp(), "");
-    peek.SetAgentName(OEString("Host 1.0"));
-    peek.SetTempFilePath(OEString("/tmp/x"));
-    EXPECT_EQ(peek.Agent(), "Host 1.0");
-    EXPECT_EQ(peek.Temp(), "/tmp/x");
 
     OEString temp;
     VRNNetAccess::SetupTempPathFromHInst(nullptr, temp);
