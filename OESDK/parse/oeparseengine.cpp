@@ -105,6 +105,7 @@ public:
             if (length >= sizeof padded - 8) continue; // no such tag: the longest has 37 characters
             std::memcpy(padded, name, length);
             NameKey key(padded, length, true);
+            m_allPlain = m_allPlain && IsPlainName(name, length);
             std::uint32_t slot = key.Hash() & kMask;
             while (m_slots[slot].m_entry) slot = (slot + 1) & kMask;
             m_slots[slot] = Slot{&table[i], key.m_first, key.m_last, static_cast<unsigned short>(length)};
@@ -122,7 +123,20 @@ public:
         }
     }
 
+    // Every name is a letter followed by letters, digits, "." and "_" (true of the built-in
+    // table): a name found here holds nothing that would end a tag name early.
+    bool AllPlain() const { return m_allPlain; }
+
 private:
+    static bool IsPlainName(const char* name, std::size_t length) {
+        for (std::size_t i = 0; i < length; ++i) {
+            const char c = name[i];
+            const bool letter = (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
+            if (!letter && (i == 0 || !((c >= '0' && c <= '9') || c == '.' || c == '_'))) return false;
+        }
+        return length > 0;
+    }
+
     enum : std::uint32_t { kSize = 4096, kMask = kSize - 1 };
     struct Slot {
         const OETagDictionaryEntry* m_entry;
@@ -131,6 +145,7 @@ private:
         unsigned short m_length;
     };
     Slot m_slots[kSize];
+    bool m_allPlain = true;
 };
 
 const NameIndex& TheNameIndex() {
@@ -686,7 +701,7 @@ OE_ALWAYS_INLINE int OEParseEngine::FastToken(const OETagDictionaryEntry*& entry
     const char* base = m_data;
     unsigned long p = m_pos;
     if (p + 80 > m_size) return kNotFast;
-    {
+    if (base[p] != '<') { // after an element's value the scan already stands at the "<"
         const __m128i v = Load16(base + p);
         const unsigned lt = MaskOf(v, '<');
         if (!lt) return kNotFast;
@@ -700,7 +715,10 @@ OE_ALWAYS_INLINE int OEParseEngine::FastToken(const OETagDictionaryEntry*& entry
     if (!gt) return kNotFast;
     const unsigned g = static_cast<unsigned>(__builtin_ctz(gt));
     const unsigned from = base[p + 1] == '/' ? 1u : 0u;
-    if (g <= from || (NameStopMask(t) & LowBits(g) & ~from) || !IsNameStart(base[p + 1 + from]))
+    // A name the index knows is plain, so when all its names are, checking what the name holds is
+    // left to the lookup.
+    if (g <= from || (!g_nameIndex->AllPlain() &&
+                      ((NameStopMask(t) & LowBits(g) & ~from) || !IsNameStart(base[p + 1 + from]))))
         return kNotFast;
     const unsigned long nameStart = p + 1 + from;
     const unsigned short nameLength = static_cast<unsigned short>(g - from);
