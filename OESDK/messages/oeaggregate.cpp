@@ -223,13 +223,6 @@ int ScanBit(const OEAggregateDesc& d, OETagID tag, unsigned short version, unsig
     return -1;
 }
 
-// The presence bit a slot's tag owns at `version`, or -1.
-inline int SlotBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, unsigned short version) {
-    if (!s || s->m_bit == 0xFF) return -1;
-    if (d.m_valid[s->m_bit].m_versionMask & version) return s->m_bit;
-    return s->m_dup ? ScanBit(d, s->m_tag, version, static_cast<unsigned short>(s->m_bit + 1)) : -1;
-}
-
 OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
     typedef OEAggregateIndex::Slot Slot;
     const unsigned short bitRows = BitRows(d);
@@ -315,17 +308,47 @@ const unsigned char* OEAggregateDesc::Bits() const {
     return index ? index->m_rowBit : nullptr;
 }
 
-inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
-    const unsigned short version = StoredMsgSetVersion();
-    if (const OEAggregateIndex* index = d.Index()) {
-        const OEAggregateIndex::Slot* s = index->Find(tag);
-        bit = SlotBit(d, s, version);
-        return s && s->m_row != 0xFFFF ? &d.m_fields[s->m_row] : nullptr;
-    }
+namespace {
+
+#if defined(__GNUC__)
+#define OE_COLD __attribute__((noinline, cold))
+#else
+#define OE_COLD
+#endif
+
+// Locate without an index (memory was short): the tables are searched.
+OE_COLD const OEFieldRow* LocateByScan(const OEAggregateDesc& d, OETagID tag, unsigned short version,
+                                       int& bit) {
     bit = ScanBit(d, tag, version);
     for (unsigned short i = 0; i < d.m_fieldCount; ++i)
         if (d.m_fields[i].m_tag == tag) return &d.m_fields[i];
     return nullptr;
+}
+
+// A tag whose first valid row does not apply at this version: a later row of it may.
+OE_COLD int LaterBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, unsigned short version) {
+    return s->m_dup ? ScanBit(d, s->m_tag, version, static_cast<unsigned short>(s->m_bit + 1)) : -1;
+}
+
+} // namespace
+
+// Kept small, as it is inlined in every lookup: the rare cases are calls.
+inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
+    const unsigned short version = StoredMsgSetVersion();
+    const OEAggregateIndex* index = d.m_index.load(std::memory_order_acquire);
+    if (!index && !(index = d.MakeIndex())) return LocateByScan(d, tag, version, bit);
+    const OEAggregateIndex::Slot* s = index->Find(tag);
+    if (!s) {
+        bit = -1;
+        return nullptr;
+    }
+    if (s->m_bit == 0xFF)
+        bit = -1;
+    else if (d.m_valid[s->m_bit].m_versionMask & version)
+        bit = s->m_bit;
+    else
+        bit = LaterBit(d, s, version);
+    return s->m_row != 0xFFFF ? &d.m_fields[s->m_row] : nullptr;
 }
 
 unsigned short OEAggregate::IsValidTag(OETagID tag) const {
@@ -441,7 +464,20 @@ OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, c
     if (!entry) return OEPS_INVALID;
     int bit;
     const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
-    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) return OEPS_INVALID;
+    if (!row) return OEPS_INVALID;
+    const OEFieldKind kind = row->m_kind;
+    if (kind == OEFK_TEXT) {
+        // The most common element, stored here rather than through StoreText's dispatch.
+        if (bit >= 0) {
+            OEString* str = static_cast<OEString*>(Slot(row));
+            if (!str->AssignText(value)) return OEPS_OK; // no memory: the thread's error code says so
+            if (str->ExceedsSpecLength())
+                OELogParseWarning(OEPW_TOOLONG, value.c_str(), "", row->m_tag, this);
+            SetPresentBit(static_cast<unsigned short>(bit));
+        }
+        return OEPS_OK;
+    }
+    if (kind == OEFK_CHILD || kind == OEFK_LIST) return OEPS_INVALID;
     if (bit >= 0) StoreText(row, bit, value);
     return OEPS_OK;
 }
