@@ -63,7 +63,9 @@ void Free(void* block) {
 // Every block is preceded by one word: the slab it was cut from, or null for a block taken from
 // the heap on its own (those start 16 bytes into their heap allocation). A slab counts the blocks
 // cut from it that are still in use, plus one while it is some thread's current slab; whoever
-// brings the count to zero gives the slab back.
+// brings the count to zero gives the slab back. The thread that cuts from a slab adds to the
+// count for many blocks at a time (its reserve) rather than once a block, so that cutting a block
+// is no atomic operation; the reserve is given back with the slab.
 
 namespace {
 
@@ -71,19 +73,26 @@ struct Slab {
     std::atomic<std::size_t> m_live;
     char* m_next;
     char* m_end;
+    std::size_t m_reserve; // counted in m_live but not yet cut; read and written by the owner only
 };
 
 const std::size_t kAlign = 16;
+const std::size_t kReserveStep = 1024;
 
 inline Slab*& SlabOf(void* block) {
     return *reinterpret_cast<Slab**>(static_cast<char*>(block) - sizeof(Slab*));
 }
 
-void ReleaseSlab(Slab* slab) {
-    if (slab->m_live.fetch_sub(1, std::memory_order_acq_rel) == 1) {
+void ReleaseSlab(Slab* slab, std::size_t count = 1) {
+    if (slab->m_live.fetch_sub(count, std::memory_order_acq_rel) == count) {
         slab->~Slab();
         std::free(slab);
     }
+}
+
+// The owner lets go of its current slab: its own count and the reserve it did not use.
+void ReleaseCurrentSlab(Slab* slab) {
+    ReleaseSlab(slab, 1 + slab->m_reserve);
 }
 
 // The calling thread's current slab. Plain data, so that it can be read even while the thread's
@@ -101,7 +110,7 @@ thread_local Cursor t_cursor = {nullptr, false};
 
 struct CursorGuard {
     ~CursorGuard() {
-        if (t_cursor.m_slab) ReleaseSlab(t_cursor.m_slab);
+        if (t_cursor.m_slab) ReleaseCurrentSlab(t_cursor.m_slab);
         t_cursor.m_slab = nullptr;
         t_cursor.m_ended = true;
     }
@@ -133,7 +142,8 @@ Slab* NewCurrentSlab() {
     slab->m_live.store(1, std::memory_order_relaxed);
     slab->m_next = SlabStart(slab);
     slab->m_end = static_cast<char*>(raw) + kSlabBytes;
-    if (t_cursor.m_slab) ReleaseSlab(t_cursor.m_slab);
+    slab->m_reserve = 0;
+    if (t_cursor.m_slab) ReleaseCurrentSlab(t_cursor.m_slab);
     t_cursor.m_slab = slab;
     return slab;
 }
@@ -153,13 +163,18 @@ inline void* PoolCut(std::size_t bytes, std::size_t align) {
         for (int attempt = 0; attempt < 2; ++attempt) {
             if (slab) {
                 // Everything cut from the slab is back: start it over.
-                if (slab->m_live.load(std::memory_order_acquire) == 1) slab->m_next = SlabStart(slab);
+                if (slab->m_live.load(std::memory_order_acquire) == 1 + slab->m_reserve)
+                    slab->m_next = SlabStart(slab);
                 std::uintptr_t at = reinterpret_cast<std::uintptr_t>(slab->m_next) + sizeof(Slab*);
                 at = (at + align - 1) & ~static_cast<std::uintptr_t>(align - 1);
                 char* block = reinterpret_cast<char*>(at);
                 if (block + size <= slab->m_end) {
+                    if (slab->m_reserve == 0) {
+                        slab->m_live.fetch_add(kReserveStep, std::memory_order_relaxed);
+                        slab->m_reserve = kReserveStep;
+                    }
+                    --slab->m_reserve;
                     slab->m_next = block + size;
-                    slab->m_live.fetch_add(1, std::memory_order_relaxed);
                     SlabOf(block) = slab;
                     return block;
                 }
