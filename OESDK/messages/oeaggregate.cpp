@@ -312,8 +312,10 @@ namespace {
 
 #if defined(__GNUC__)
 #define OE_COLD __attribute__((noinline, cold))
+#define OE_ALWAYS_INLINE inline __attribute__((always_inline))
 #else
 #define OE_COLD
+#define OE_ALWAYS_INLINE inline
 #endif
 
 // Locate without an index (memory was short): the tables are searched.
@@ -460,28 +462,6 @@ OEParseStatus OEAggregate::PushAndSetObject(OEDataObj* child, OETagID tag) {
     return OEDataObj::PushAndSetObject(child, OETAG_NONE); // version and parser, as always
 }
 
-OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
-    if (!entry) return OEPS_INVALID;
-    int bit;
-    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
-    if (!row) return OEPS_INVALID;
-    const OEFieldKind kind = row->m_kind;
-    if (kind == OEFK_TEXT) {
-        // The most common element, stored here rather than through StoreText's dispatch.
-        if (bit >= 0) {
-            OEString* str = static_cast<OEString*>(Slot(row));
-            if (!str->AssignText(value)) return OEPS_OK; // no memory: the thread's error code says so
-            if (str->ExceedsSpecLength())
-                OELogParseWarning(OEPW_TOOLONG, value.c_str(), "", row->m_tag, this);
-            SetPresentBit(static_cast<unsigned short>(bit));
-        }
-        return OEPS_OK;
-    }
-    if (kind == OEFK_CHILD || kind == OEFK_LIST) return OEPS_INVALID;
-    if (bit >= 0) StoreText(row, bit, value);
-    return OEPS_OK;
-}
-
 unsigned short OEAggregate::RowApplies(unsigned short index) const {
     return IsValidTag(Describe().m_fields[index].m_tag);
 }
@@ -519,20 +499,24 @@ OE_NOINLINE bool ReplaceDateTime(OEDateTime& field, const char* text) {
 
 } // namespace
 
-unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
+inline unsigned short OEAggregate::StoreString(const OEFieldRow* row, int bit, const OEString& text) {
+    // Every field string keeps its own limit, whatever its class.
+    OEString* str = static_cast<OEString*>(Slot(row));
+    if (!str->AssignText(text)) return 3; // no memory for the value
+    if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, text.c_str(), "", row->m_tag, this);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
+}
+
+// Inlined in HandleTagElement, the parse's caller, to spare a call per element.
+OE_ALWAYS_INLINE unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
     const OETagID tag = row->m_tag;
     const unsigned short mark = static_cast<unsigned short>(bit);
     void* slot = Slot(row);
     const char* s = text.c_str();
     switch (row->m_kind) {
-    case OEFK_TEXT: {
-        // Every field string keeps its own limit, whatever its class.
-        OEString* str = static_cast<OEString*>(slot);
-        if (!str->AssignText(text)) return 3; // no memory for the value
-        if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
-        SetPresentBit(mark);
-        return 1;
-    }
+    case OEFK_TEXT:
+        return StoreString(row, bit, text);
     // A value not yet present converts in place (its field is not read while unmarked); one that
     // is present converts through a copy, so that a refused text leaves the old value.
     case OEFK_AMOUNT: {
@@ -598,6 +582,22 @@ unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OESt
     }
     OELogParseWarning(OEPW_BADFORMAT, s, "", tag, this);
     return 0;
+}
+
+OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
+    if (!entry) return OEPS_INVALID;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
+    if (!row) return OEPS_INVALID;
+    const OEFieldKind kind = row->m_kind;
+    if (kind == OEFK_TEXT) {
+        // The most common element, stored without StoreText's dispatch.
+        if (bit >= 0) StoreString(row, bit, value);
+        return OEPS_OK;
+    }
+    if (kind == OEFK_CHILD || kind == OEFK_LIST) return OEPS_INVALID;
+    if (bit >= 0) StoreText(row, bit, value);
+    return OEPS_OK;
 }
 
 unsigned short OEAggregate::SetText(OETagID tag, const OEString& value) {
