@@ -71,13 +71,32 @@ bool SameIgnoringCase(const char* a, const char* b, std::size_t n) {
     return true;
 }
 
-// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded.
+// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded. The bytes are read
+// as one or two word loads that stay inside the text and upper-cased eight at a time (the byte
+// order of the key is that of the machine: the targets are little-endian).
+#if defined(__BYTE_ORDER__) && __BYTE_ORDER__ != __ORDER_LITTLE_ENDIAN__
+#error "UpperKey assembles its key in little-endian byte order"
+#endif
 inline std::uint64_t UpperKey(const char* text, std::size_t length) {
     std::uint64_t key = 0;
-    const std::size_t n = length < 8 ? length : 8;
-    for (std::size_t i = 0; i < n; ++i)
-        key |= std::uint64_t(static_cast<unsigned char>(UpperAscii(text[i]))) << (8 * i);
-    return key;
+    if (length >= 8) {
+        std::memcpy(&key, text, 8);
+    } else if (length >= 4) {
+        std::uint32_t head, tail; // overlapping when shorter than 8: the shared bytes agree
+        std::memcpy(&head, text, 4);
+        std::memcpy(&tail, text + length - 4, 4);
+        key = head | (std::uint64_t(tail) << (8 * (length - 4)));
+    } else {
+        for (std::size_t i = 0; i < length; ++i)
+            key |= std::uint64_t(static_cast<unsigned char>(text[i])) << (8 * i);
+    }
+    // Per byte: 'a' to 'z' (high bit clear) loses 0x20; carries never cross a byte.
+    const std::uint64_t ones = 0x0101010101010101ull;
+    const std::uint64_t low7 = key & (0x7F * ones);
+    const std::uint64_t atLeastA = low7 + (0x80 - 'a') * ones;
+    const std::uint64_t aboveZ = low7 + (0x80 - 'z' - 1) * ones;
+    const std::uint64_t lower = atLeastA & ~aboveZ & ~key & (0x80 * ones);
+    return key - (lower >> 2);
 }
 
 struct KeywordLookup {
