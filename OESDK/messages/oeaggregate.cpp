@@ -531,73 +531,70 @@ inline unsigned short OEAggregate::StoreString(const OEFieldRow* row, int bit, c
 OE_ALWAYS_INLINE unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
     const OETagID tag = row->m_tag;
     const unsigned short mark = static_cast<unsigned short>(bit);
+    const OEFieldKind kind = row->m_kind;
+    if (kind == OEFK_TEXT) return StoreString(row, bit, text);
     void* slot = Slot(row);
     const char* s = text.c_str();
-    switch (row->m_kind) {
-    case OEFK_TEXT:
-        return StoreString(row, bit, text);
+    // The kinds of a statement's lines are tested one after the other, not through a jump table:
+    // separate branches follow the order of a record's elements, one indirect jump does not.
     // A value not yet present converts in place (its field is not read while unmarked); one that
     // is present converts through a copy, so that a refused text leaves the old value.
-    case OEFK_AMOUNT: {
-        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
-        if (!PresentBit(mark)) {
-            if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
-        } else if (!ReplaceAmount(*field, s)) {
-            break;
-        }
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_DATETIME: {
+    if (kind == OEFK_DATETIME) {
         OEDateTime* field = static_cast<OEDateTime*>(slot);
-        if (!PresentBit(mark)) {
-            if (!field->ConvertStringToOEDateTime(s)) break;
-        } else if (!ReplaceDateTime(*field, s)) {
-            break;
+        if (PresentBit(mark) ? ReplaceDateTime(*field, s) : field->ConvertStringToOEDateTime(s) != 0) {
+            SetPresentBit(mark);
+            return 1;
         }
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_TEXTLIST:
-        return AppendText(tag, text);
-    case OEFK_ENUM: {
+    } else if (kind == OEFK_AMOUNT) {
+        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
+        if (PresentBit(mark) ? ReplaceAmount(*field, s)
+                             : field->ConvertStringToOEPrecisionInteger(s) && field->IsValid()) {
+            SetPresentBit(mark);
+            return 1;
+        }
+    } else if (kind == OEFK_ENUM) {
         int keyword = MatchKeyword(row->m_keywords, s, text.GetStrLength());
-        if (keyword < 0) break;
-        *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_BOOL: {
-        if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
-        *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_USHORT:
-    case OEFK_ULONG:
-    case OEFK_SLONG: {
-        long long value = 0;
-        if (!ParseLong(s, row->m_kind == OEFK_SLONG, value)) break;
-        if (row->m_kind == OEFK_USHORT) {
-            if (value > 65535) {
-                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
-                return 0;
-            }
-            *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(value);
-        } else if (row->m_kind == OEFK_ULONG) {
-            *static_cast<unsigned long*>(slot) = static_cast<unsigned long>(value);
-        } else {
-            if (value > 2147483647LL || value < -2147483648LL) {
-                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
-                return 0;
-            }
-            *static_cast<long*>(slot) = static_cast<long>(value);
+        if (keyword >= 0) {
+            *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
+            SetPresentBit(mark);
+            return 1;
         }
-        SetPresentBit(mark);
-        return 1;
-    }
-    default:
-        return 0;
+    } else {
+        switch (kind) {
+        case OEFK_TEXTLIST:
+            return AppendText(tag, text);
+        case OEFK_BOOL: {
+            if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
+            *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
+            SetPresentBit(mark);
+            return 1;
+        }
+        case OEFK_USHORT:
+        case OEFK_ULONG:
+        case OEFK_SLONG: {
+            long long value = 0;
+            if (!ParseLong(s, kind == OEFK_SLONG, value)) break;
+            if (kind == OEFK_USHORT) {
+                if (value > 65535) {
+                    OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                    return 0;
+                }
+                *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(value);
+            } else if (kind == OEFK_ULONG) {
+                *static_cast<unsigned long*>(slot) = static_cast<unsigned long>(value);
+            } else {
+                if (value > 2147483647LL || value < -2147483648LL) {
+                    OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                    return 0;
+                }
+                *static_cast<long*>(slot) = static_cast<long>(value);
+            }
+            SetPresentBit(mark);
+            return 1;
+        }
+        default:
+            return 0;
+        }
     }
     OELogParseWarning(OEPW_BADFORMAT, s, "", tag, this);
     return 0;
