@@ -32,7 +32,12 @@ protected:
     // Returns 1, or 0 when memory is short (thread error 1). Entries between the old count and
     // i are null.
     unsigned short StoreAt(unsigned short index, void* element);
-    unsigned short StoreAppend(void* element) { return StoreAt(m_count, element); }
+    // With room left, an append is a plain store.
+    unsigned short StoreAppend(void* element) {
+        if (m_count >= m_capacity) return StoreAt(m_count, element);
+        m_block[m_count++] = element;
+        return 1;
+    }
     void* ElementAt(unsigned short index) const { return index < m_count ? m_block[index] : nullptr; }
     // Takes the entry out and closes the gap; returns it (the caller decides its fate).
     void* RemoveAt(unsigned short index);

@@ -63,7 +63,9 @@ void Free(void* block) {
 // Every block is preceded by one word: the slab it was cut from, or null for a block taken from
 // the heap on its own (those start 16 bytes into their heap allocation). A slab counts the blocks
 // cut from it that are still in use, plus one while it is some thread's current slab; whoever
-// brings the count to zero gives the slab back.
+// brings the count to zero gives the slab back. The thread that cuts from a slab adds to the
+// count for many blocks at a time (its reserve) rather than once a block, so that cutting a block
+// is no atomic operation; the reserve is given back with the slab.
 
 namespace {
 
@@ -71,6 +73,7 @@ struct Slab {
     std::atomic<std::size_t> m_live;
     char* m_next;
     char* m_end;
+    std::size_t m_reserve; // counted in m_live but not yet cut; read and written by the owner only
 };
 
 const std::size_t kAlign = 16;
@@ -79,11 +82,16 @@ inline Slab*& SlabOf(void* block) {
     return *reinterpret_cast<Slab**>(static_cast<char*>(block) - sizeof(Slab*));
 }
 
-void ReleaseSlab(Slab* slab) {
-    if (slab->m_live.fetch_sub(1, std::memory_order_acq_rel) == 1) {
+void ReleaseSlab(Slab* slab, std::size_t count = 1) {
+    if (slab->m_live.fetch_sub(count, std::memory_order_acq_rel) == count) {
         slab->~Slab();
         std::free(slab);
     }
+}
+
+// The owner lets go of its current slab: its own count and the reserve it did not use.
+void ReleaseCurrentSlab(Slab* slab) {
+    ReleaseSlab(slab, 1 + slab->m_reserve);
 }
 
 // The calling thread's current slab. Plain data, so that it can be read even while the thread's
@@ -101,7 +109,7 @@ thread_local Cursor t_cursor = {nullptr, false};
 
 struct CursorGuard {
     ~CursorGuard() {
-        if (t_cursor.m_slab) ReleaseSlab(t_cursor.m_slab);
+        if (t_cursor.m_slab) ReleaseCurrentSlab(t_cursor.m_slab);
         t_cursor.m_slab = nullptr;
         t_cursor.m_ended = true;
     }
@@ -117,6 +125,7 @@ void* HeapBlock(std::size_t bytes) {
 
 #if !defined(OESDK_POOL_DIRECT)
 const std::size_t kSlabBytes = 64 * 1024;
+const std::size_t kReserveStep = 1024;
 const std::size_t kSlabHeader = (sizeof(Slab) + kAlign - 1) / kAlign * kAlign;
 
 inline char* SlabStart(Slab* slab) {
@@ -133,7 +142,8 @@ Slab* NewCurrentSlab() {
     slab->m_live.store(1, std::memory_order_relaxed);
     slab->m_next = SlabStart(slab);
     slab->m_end = static_cast<char*>(raw) + kSlabBytes;
-    if (t_cursor.m_slab) ReleaseSlab(t_cursor.m_slab);
+    slab->m_reserve = 0;
+    if (t_cursor.m_slab) ReleaseCurrentSlab(t_cursor.m_slab);
     t_cursor.m_slab = slab;
     return slab;
 }
@@ -143,35 +153,52 @@ Slab* NewCurrentSlab() {
 
 namespace {
 
+#if !defined(OESDK_POOL_DIRECT)
+// A block of `size` bytes (a multiple of 8) aligned to `align` from `slab`, which is started over
+// first when everything cut from it is back; null when the block does not fit.
+inline void* CutFrom(Slab* slab, std::size_t size, std::size_t align) {
+    if (slab->m_live.load(std::memory_order_acquire) == 1 + slab->m_reserve) slab->m_next = SlabStart(slab);
+    std::uintptr_t at = reinterpret_cast<std::uintptr_t>(slab->m_next) + sizeof(Slab*);
+    at = (at + align - 1) & ~static_cast<std::uintptr_t>(align - 1);
+    char* block = reinterpret_cast<char*>(at);
+    if (block + size > slab->m_end) return nullptr;
+    if (slab->m_reserve == 0) {
+        slab->m_live.fetch_add(kReserveStep, std::memory_order_relaxed);
+        slab->m_reserve = kReserveStep;
+    }
+    --slab->m_reserve;
+    slab->m_next = block + size;
+    SlabOf(block) = slab;
+    return block;
+}
+
+// Everything but a cut from the current slab: the thread's first block, a full slab, a large
+// block, a thread whose slab has been given back.
+#if defined(__GNUC__)
+__attribute__((noinline))
+#endif
+void* PoolCutSlow(std::size_t bytes, std::size_t align) {
+    if (bytes > kPoolLargest || t_cursor.m_ended) return HeapBlock(bytes);
+    Slab* slab = NewCurrentSlab();
+    return slab ? CutFrom(slab, (bytes + 7) & ~std::size_t(7), align) : nullptr;
+}
+#endif
+
 // A block of `bytes` aligned to `align` (8 or 16) with its slab word in front of it; null when
 // memory is short (the callers report it).
 inline void* PoolCut(std::size_t bytes, std::size_t align) {
 #if !defined(OESDK_POOL_DIRECT)
-    if (bytes <= kPoolLargest && !t_cursor.m_ended) {
-        const std::size_t size = (bytes + 7) & ~std::size_t(7);
-        Slab* slab = t_cursor.m_slab;
-        for (int attempt = 0; attempt < 2; ++attempt) {
-            if (slab) {
-                // Everything cut from the slab is back: start it over.
-                if (slab->m_live.load(std::memory_order_acquire) == 1) slab->m_next = SlabStart(slab);
-                std::uintptr_t at = reinterpret_cast<std::uintptr_t>(slab->m_next) + sizeof(Slab*);
-                at = (at + align - 1) & ~static_cast<std::uintptr_t>(align - 1);
-                char* block = reinterpret_cast<char*>(at);
-                if (block + size <= slab->m_end) {
-                    slab->m_next = block + size;
-                    slab->m_live.fetch_add(1, std::memory_order_relaxed);
-                    SlabOf(block) = slab;
-                    return block;
-                }
-            }
-            slab = NewCurrentSlab();
-            if (!slab) break;
+    // A current slab means the thread has not ended.
+    if (Slab* slab = t_cursor.m_slab) {
+        if (bytes <= kPoolLargest) {
+            if (void* block = CutFrom(slab, (bytes + 7) & ~std::size_t(7), align)) return block;
         }
-        return nullptr;
     }
-#endif
+    return PoolCutSlow(bytes, align);
+#else
     (void)align;
     return HeapBlock(bytes);
+#endif
 }
 
 inline void* HookedCut(std::size_t bytes, std::size_t align) {

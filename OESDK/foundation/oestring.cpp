@@ -16,6 +16,9 @@ inline void CopyBytes(char* to, const char* from, std::size_t n) {
     if (n >= 16 && n <= 32) {
         std::memcpy(to, from, 16);
         std::memcpy(to + n - 16, from + n - 16, 16);
+    } else if (n > 32 && n <= 64) {
+        std::memcpy(to, from, 32);
+        std::memcpy(to + n - 32, from + n - 32, 32);
     } else if (n >= 8 && n < 16) {
         std::memcpy(to, from, 8);
         std::memcpy(to + n - 8, from + n - 8, 8);

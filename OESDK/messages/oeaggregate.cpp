@@ -71,13 +71,32 @@ bool SameIgnoringCase(const char* a, const char* b, std::size_t n) {
     return true;
 }
 
-// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded.
+// The first eight bytes of a text of `length` bytes, upper-cased, zero-padded. The bytes are read
+// as one or two word loads that stay inside the text and upper-cased eight at a time (the byte
+// order of the key is that of the machine: the targets are little-endian).
+#if defined(__BYTE_ORDER__) && __BYTE_ORDER__ != __ORDER_LITTLE_ENDIAN__
+#error "UpperKey assembles its key in little-endian byte order"
+#endif
 inline std::uint64_t UpperKey(const char* text, std::size_t length) {
     std::uint64_t key = 0;
-    const std::size_t n = length < 8 ? length : 8;
-    for (std::size_t i = 0; i < n; ++i)
-        key |= std::uint64_t(static_cast<unsigned char>(UpperAscii(text[i]))) << (8 * i);
-    return key;
+    if (length >= 8) {
+        std::memcpy(&key, text, 8);
+    } else if (length >= 4) {
+        std::uint32_t head, tail; // overlapping when shorter than 8: the shared bytes agree
+        std::memcpy(&head, text, 4);
+        std::memcpy(&tail, text + length - 4, 4);
+        key = head | (std::uint64_t(tail) << (8 * (length - 4)));
+    } else {
+        for (std::size_t i = 0; i < length; ++i)
+            key |= std::uint64_t(static_cast<unsigned char>(text[i])) << (8 * i);
+    }
+    // Per byte: 'a' to 'z' (high bit clear) loses 0x20; carries never cross a byte.
+    const std::uint64_t ones = 0x0101010101010101ull;
+    const std::uint64_t low7 = key & (0x7F * ones);
+    const std::uint64_t atLeastA = low7 + (0x80 - 'a') * ones;
+    const std::uint64_t aboveZ = low7 + (0x80 - 'z' - 1) * ones;
+    const std::uint64_t lower = atLeastA & ~aboveZ & ~key & (0x80 * ones);
+    return key - (lower >> 2);
 }
 
 struct KeywordLookup {
@@ -223,13 +242,6 @@ int ScanBit(const OEAggregateDesc& d, OETagID tag, unsigned short version, unsig
     return -1;
 }
 
-// The presence bit a slot's tag owns at `version`, or -1.
-inline int SlotBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, unsigned short version) {
-    if (!s || s->m_bit == 0xFF) return -1;
-    if (d.m_valid[s->m_bit].m_versionMask & version) return s->m_bit;
-    return s->m_dup ? ScanBit(d, s->m_tag, version, static_cast<unsigned short>(s->m_bit + 1)) : -1;
-}
-
 OEAggregateIndex* BuildIndex(const OEAggregateDesc& d) {
     typedef OEAggregateIndex::Slot Slot;
     const unsigned short bitRows = BitRows(d);
@@ -315,17 +327,49 @@ const unsigned char* OEAggregateDesc::Bits() const {
     return index ? index->m_rowBit : nullptr;
 }
 
-inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
-    const unsigned short version = StoredMsgSetVersion();
-    if (const OEAggregateIndex* index = d.Index()) {
-        const OEAggregateIndex::Slot* s = index->Find(tag);
-        bit = SlotBit(d, s, version);
-        return s && s->m_row != 0xFFFF ? &d.m_fields[s->m_row] : nullptr;
-    }
+namespace {
+
+#if defined(__GNUC__)
+#define OE_COLD __attribute__((noinline, cold))
+#define OE_ALWAYS_INLINE inline __attribute__((always_inline))
+#else
+#define OE_COLD
+#define OE_ALWAYS_INLINE inline
+#endif
+
+// Locate without an index (memory was short): the tables are searched.
+OE_COLD const OEFieldRow* LocateByScan(const OEAggregateDesc& d, OETagID tag, unsigned short version,
+                                       int& bit) {
     bit = ScanBit(d, tag, version);
     for (unsigned short i = 0; i < d.m_fieldCount; ++i)
         if (d.m_fields[i].m_tag == tag) return &d.m_fields[i];
     return nullptr;
+}
+
+// A tag whose first valid row does not apply at this version: a later row of it may.
+OE_COLD int LaterBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, unsigned short version) {
+    return s->m_dup ? ScanBit(d, s->m_tag, version, static_cast<unsigned short>(s->m_bit + 1)) : -1;
+}
+
+} // namespace
+
+// Kept small, as it is inlined in every lookup: the rare cases are calls.
+inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
+    const unsigned short version = StoredMsgSetVersion();
+    const OEAggregateIndex* index = d.m_index.load(std::memory_order_acquire);
+    if (!index && !(index = d.MakeIndex())) return LocateByScan(d, tag, version, bit);
+    const OEAggregateIndex::Slot* s = index->Find(tag);
+    if (!s) {
+        bit = -1;
+        return nullptr;
+    }
+    if (s->m_bit == 0xFF)
+        bit = -1;
+    else if (d.m_valid[s->m_bit].m_versionMask & version)
+        bit = s->m_bit;
+    else
+        bit = LaterBit(d, s, version);
+    return s->m_row != 0xFFFF ? &d.m_fields[s->m_row] : nullptr;
 }
 
 unsigned short OEAggregate::IsValidTag(OETagID tag) const {
@@ -437,15 +481,6 @@ OEParseStatus OEAggregate::PushAndSetObject(OEDataObj* child, OETagID tag) {
     return OEDataObj::PushAndSetObject(child, OETAG_NONE); // version and parser, as always
 }
 
-OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
-    if (!entry) return OEPS_INVALID;
-    int bit;
-    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
-    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) return OEPS_INVALID;
-    if (bit >= 0) StoreText(row, bit, value);
-    return OEPS_OK;
-}
-
 unsigned short OEAggregate::RowApplies(unsigned short index) const {
     return IsValidTag(Describe().m_fields[index].m_tag);
 }
@@ -483,85 +518,102 @@ OE_NOINLINE bool ReplaceDateTime(OEDateTime& field, const char* text) {
 
 } // namespace
 
-unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
+inline unsigned short OEAggregate::StoreString(const OEFieldRow* row, int bit, const OEString& text) {
+    // Every field string keeps its own limit, whatever its class.
+    OEString* str = static_cast<OEString*>(Slot(row));
+    if (!str->AssignText(text)) return 3; // no memory for the value
+    if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, text.c_str(), "", row->m_tag, this);
+    SetPresentBit(static_cast<unsigned short>(bit));
+    return 1;
+}
+
+// Inlined in HandleTagElement, the parse's caller, to spare a call per element.
+OE_ALWAYS_INLINE unsigned short OEAggregate::StoreText(const OEFieldRow* row, int bit, const OEString& text) {
     const OETagID tag = row->m_tag;
     const unsigned short mark = static_cast<unsigned short>(bit);
+    const OEFieldKind kind = row->m_kind;
+    if (kind == OEFK_TEXT) return StoreString(row, bit, text);
     void* slot = Slot(row);
     const char* s = text.c_str();
-    switch (row->m_kind) {
-    case OEFK_TEXT: {
-        // Every field string keeps its own limit, whatever its class.
-        OEString* str = static_cast<OEString*>(slot);
-        if (!str->AssignText(text)) return 3; // no memory for the value
-        if (str->ExceedsSpecLength()) OELogParseWarning(OEPW_TOOLONG, s, "", tag, this);
-        SetPresentBit(mark);
-        return 1;
-    }
+    // The kinds of a statement's lines are tested one after the other, not through a jump table:
+    // separate branches follow the order of a record's elements, one indirect jump does not.
     // A value not yet present converts in place (its field is not read while unmarked); one that
     // is present converts through a copy, so that a refused text leaves the old value.
-    case OEFK_AMOUNT: {
-        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
-        if (!PresentBit(mark)) {
-            if (!field->ConvertStringToOEPrecisionInteger(s) || !field->IsValid()) break;
-        } else if (!ReplaceAmount(*field, s)) {
-            break;
-        }
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_DATETIME: {
+    if (kind == OEFK_DATETIME) {
         OEDateTime* field = static_cast<OEDateTime*>(slot);
-        if (!PresentBit(mark)) {
-            if (!field->ConvertStringToOEDateTime(s)) break;
-        } else if (!ReplaceDateTime(*field, s)) {
-            break;
+        if (PresentBit(mark) ? ReplaceDateTime(*field, s) : field->ConvertStringToOEDateTime(s) != 0) {
+            SetPresentBit(mark);
+            return 1;
         }
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_TEXTLIST:
-        return AppendText(tag, text);
-    case OEFK_ENUM: {
+    } else if (kind == OEFK_AMOUNT) {
+        OEPrecisionInteger* field = static_cast<OEPrecisionInteger*>(slot);
+        if (PresentBit(mark) ? ReplaceAmount(*field, s)
+                             : field->ConvertStringToOEPrecisionInteger(s) && field->IsValid()) {
+            SetPresentBit(mark);
+            return 1;
+        }
+    } else if (kind == OEFK_ENUM) {
         int keyword = MatchKeyword(row->m_keywords, s, text.GetStrLength());
-        if (keyword < 0) break;
-        *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_BOOL: {
-        if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
-        *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
-        SetPresentBit(mark);
-        return 1;
-    }
-    case OEFK_USHORT:
-    case OEFK_ULONG:
-    case OEFK_SLONG: {
-        long long value = 0;
-        if (!ParseLong(s, row->m_kind == OEFK_SLONG, value)) break;
-        if (row->m_kind == OEFK_USHORT) {
-            if (value > 65535) {
-                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
-                return 0;
-            }
-            *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(value);
-        } else if (row->m_kind == OEFK_ULONG) {
-            *static_cast<unsigned long*>(slot) = static_cast<unsigned long>(value);
-        } else {
-            if (value > 2147483647LL || value < -2147483648LL) {
-                OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
-                return 0;
-            }
-            *static_cast<long*>(slot) = static_cast<long>(value);
+        if (keyword >= 0) {
+            *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(keyword);
+            SetPresentBit(mark);
+            return 1;
         }
-        SetPresentBit(mark);
-        return 1;
-    }
-    default:
-        return 0;
+    } else {
+        switch (kind) {
+        case OEFK_TEXTLIST:
+            return AppendText(tag, text);
+        case OEFK_BOOL: {
+            if (std::strcmp(s, "Y") != 0 && std::strcmp(s, "N") != 0) break;
+            *static_cast<unsigned short*>(slot) = s[0] == 'Y' ? 1 : 0;
+            SetPresentBit(mark);
+            return 1;
+        }
+        case OEFK_USHORT:
+        case OEFK_ULONG:
+        case OEFK_SLONG: {
+            long long value = 0;
+            if (!ParseLong(s, kind == OEFK_SLONG, value)) break;
+            if (kind == OEFK_USHORT) {
+                if (value > 65535) {
+                    OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                    return 0;
+                }
+                *static_cast<unsigned short*>(slot) = static_cast<unsigned short>(value);
+            } else if (kind == OEFK_ULONG) {
+                *static_cast<unsigned long*>(slot) = static_cast<unsigned long>(value);
+            } else {
+                if (value > 2147483647LL || value < -2147483648LL) {
+                    OELogParseWarning(OEPW_OUTOFRANGE, s, "", tag, this);
+                    return 0;
+                }
+                *static_cast<long*>(slot) = static_cast<long>(value);
+            }
+            SetPresentBit(mark);
+            return 1;
+        }
+        default:
+            return 0;
+        }
     }
     OELogParseWarning(OEPW_BADFORMAT, s, "", tag, this);
     return 0;
+}
+
+OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, const OEString& value) {
+    if (!entry) return OEPS_INVALID;
+    int bit;
+    const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
+    if (!row) return OEPS_INVALID;
+    const OEFieldKind kind = row->m_kind;
+    if (kind == OEFK_TEXT) {
+        // The most common element, stored without StoreText's dispatch.
+        if (bit >= 0) StoreString(row, bit, value);
+        return OEPS_OK;
+    }
+    if (kind == OEFK_CHILD || kind == OEFK_LIST) return OEPS_INVALID;
+    if (bit >= 0) StoreText(row, bit, value);
+    return OEPS_OK;
 }
 
 unsigned short OEAggregate::SetText(OETagID tag, const OEString& value) {

@@ -232,6 +232,8 @@ private:
     unsigned short RowPresentIn(const OEAggregateDesc& d, unsigned short index) const;
     // Converts and stores the text of element row `row` whose tag owns presence bit `bit` (>= 0).
     unsigned short StoreText(const OEFieldRow* row, int bit, const OEString& text);
+    // StoreText of a text row: 1, or 3 when memory is short.
+    unsigned short StoreString(const OEFieldRow* row, int bit, const OEString& text);
 
 public:
     // Shared by the classes that keep lists of wrappers (message sets, synchronisation):

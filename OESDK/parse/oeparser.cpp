@@ -10,7 +10,7 @@
 // ---------------------------------------------------------------------------------------------
 // OEParser
 
-OEParser::OEParser() : m_current(nullptr), m_stack{}, m_depth(0) {
+OEParser::OEParser() : m_current(nullptr), m_stack{}, m_depth(0), m_rowHint{} {
     if (OEParseLogger* log = OEParseLogger::TheOEParseLogger()) {
         log->EnableLogging(1);
         log->DeleteAll();
@@ -58,15 +58,33 @@ unsigned short OEParser::PopObject() {
     return 1;
 }
 
-unsigned short OEParser::IsValidTag(OETagID tag) const {
+// Any row of the table with the tag whose version mask covers the current object's version.
+// A tag almost always meets the same table again (every transaction of a statement), so the row
+// that answered last time is tried first.
+inline unsigned short OEParser::CheckTag(OETagID tag) const {
     if (!m_validTags.m_rows) return 1;
+    const unsigned short hint = m_rowHint[static_cast<unsigned>(tag) % kHintSlots];
+    if (hint < m_validTags.m_count && m_validTags.m_rows[hint].m_tag == tag && m_current &&
+        (m_validTags.m_rows[hint].m_versionMask & m_current->GetMsgSetVersion()))
+        return 1;
+    return SearchTag(tag);
+}
+
+unsigned short OEParser::SearchTag(OETagID tag) const {
     if (m_validTags.m_count == 0) return 0;
     unsigned short version = m_current ? m_current->GetMsgSetVersion() : 0;
     for (unsigned short i = 0; i < m_validTags.m_count; ++i) {
         const OETagRow& row = m_validTags.m_rows[i];
-        if (row.m_tag == tag && (row.m_versionMask & version)) return 1;
+        if (row.m_tag == tag && (row.m_versionMask & version)) {
+            m_rowHint[static_cast<unsigned>(tag) % kHintSlots] = i;
+            return 1;
+        }
     }
     return 0;
+}
+
+unsigned short OEParser::IsValidTag(OETagID tag) const {
+    return CheckTag(tag);
 }
 
 unsigned short OEParser::AppendParseException(OEParseWarning code, const OEString& text,
@@ -223,7 +241,7 @@ OEParseStatus OESimpleParser::RunTokenLoop(OEParseEngine& engine) {
         OETagID id = entry ? entry->m_id : OETAG_NONE;
         switch (kind) {
         case OETK_AGGSTART:
-            if (IsValidTag(id)) {
+            if (CheckTag(id)) {
                 OEParseStatus status = m_current->HandleTagStart(entry);
                 if (status == OEPS_INVALID && engine.LastStartWasEmpty()) {
                     // "<MEMO></MEMO>": an element without a value, not an aggregate.
@@ -243,7 +261,7 @@ OEParseStatus OESimpleParser::RunTokenLoop(OEParseEngine& engine) {
         case OETK_ELEMENT: {
             OEString& value = engine.GetValue();
             const bool password = id == OETAG_USERPASS;
-            if (IsValidTag(id)) {
+            if (CheckTag(id)) {
                 OEParseStatus status = m_current->HandleTagElement(entry, value);
                 if (password) OEUtility::MaskText(value);
                 if (status != OEPS_OK) return status;

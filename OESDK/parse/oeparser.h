@@ -65,6 +65,19 @@ protected:
     Frame m_stack[kMaxDepth];
     short m_depth;
     OEArrayOfTags m_validTags;
+
+private:
+    friend class OESimpleParser;
+    enum : unsigned { kHintSlots = 512 };
+
+    // IsValidTag as the token loop inlines it; the search of the table is out of line.
+    inline unsigned short CheckTag(OETagID tag) const;
+    unsigned short SearchTag(OETagID tag) const;
+
+    // Per tag (its low bits), the row of a table where the tag was last found valid. Only a place
+    // to look first: a row it names is read and checked like any other, so whatever it holds the
+    // filter answers as the full search of the table does.
+    mutable unsigned short m_rowHint[kHintSlots];
 };
 
 class OE_API OESimpleParser : public OEParser {

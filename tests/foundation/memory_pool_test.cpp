@@ -6,6 +6,9 @@
 
 #include <cstdint>
 #include <cstring>
+#if defined(__GLIBC__)
+#include <malloc.h>
+#endif
 #include <random>
 #include <thread>
 #include <vector>
@@ -97,6 +100,27 @@ TEST(MemoryPool, CurrentSlabStartsOverOnceEverythingCutFromItIsBack) {
     }).join();
     EXPECT_EQ(again, firstThere);
 }
+
+#if defined(__GLIBC__) && (__GLIBC__ > 2 || (__GLIBC__ == 2 && __GLIBC_MINOR__ >= 33))
+TEST(MemoryPool, SlabsGoBackOnceTheirThreadAndBlocksAreGone) {
+    // Small and larger blocks over several slabs, cut on a thread that then ends and freed here:
+    // each slab goes back to the heap with its last block, none is kept or freed early.
+    for (std::size_t size : {8u, 100u}) {
+        std::vector<void*> blocks;
+        blocks.reserve(6000);
+        const std::size_t before = mallinfo2().uordblks;
+        std::thread([&] {
+            for (int i = 0; i < 6000; ++i) blocks.push_back(OEMemory::PoolAllocBytes(size));
+        }).join();
+        for (void* p : blocks) {
+            ASSERT_NE(p, nullptr);
+            std::memset(p, 0x5A, size);
+        }
+        for (void* p : blocks) OEMemory::PoolFree(p);
+        EXPECT_LT(mallinfo2().uordblks, before + 16 * 1024) << "size " << size;
+    }
+}
+#endif
 #endif
 
 // A host's own data object class: `new` and `delete` go through the pool, across threads too.

@@ -289,3 +289,59 @@ TEST(Parser, EveryAllocationFailureGivesStatus3) {
     }
     EXPECT_GT(g_failAt, 3);
 }
+
+namespace {
+// An object with a chosen valid table and message-set version, for the parser's tag filter.
+class Filtered : public OEDataObj {
+public:
+    Filtered(const OETagRow* rows, unsigned short count, unsigned short version)
+        : OEDataObj(version), m_rows(rows), m_count(count) {}
+    unsigned short GetArrayOfValidTags(OEArrayOfTags& tags) const override {
+        tags.Set(m_rows, m_count);
+        return 1;
+    }
+
+private:
+    const OETagRow* m_rows;
+    unsigned short m_count;
+};
+} // namespace
+
+TEST(Parser, TagFilterAnswersAsTheWholeTableWhateverCameBefore) {
+    // The filter remembers where it last found a tag; the queries below move between objects whose
+    // tables hold the same tags at other rows, under other masks, or tags that share its memory
+    // slot (ids 512 apart), and every answer must still be the table's own.
+    const OETagID a = static_cast<OETagID>(100), b = static_cast<OETagID>(612),
+                  c = static_cast<OETagID>(1124);
+    const OETagRow first[] = {{a, OEVM_V1, 0}, {b, OEVM_ALL, 0}, {a, OEVM_NOTV1, 0}};
+    const OETagRow second[] = {{b, OEVM_V2, 0}, {c, OEVM_ALL, 0}, {a, OEVM_ALL, 0}};
+    struct Object {
+        const OETagRow* rows;
+        unsigned short count, version;
+    } objects[] = {{first, 3, 1},  {first, 3, 2}, {second, 3, 1},
+                   {second, 3, 2}, {first, 3, 0}, {first, 0, 1}};
+    OEParser parser;
+    Filtered root(nullptr, 0, 1);
+    parser.Parse(nullptr, &root, 0, 0);
+    for (OETagID tag : {a, b, c}) EXPECT_EQ(parser.IsValidTag(tag), 1) << "no table: every tag passes";
+    // Every order of two objects, each asked about every tag twice.
+    for (const Object& x : objects) {
+        for (const Object& y : objects) {
+            for (const Object* o : {&x, &y}) {
+                Filtered current(o->rows, o->count, o->version);
+                ASSERT_EQ(parser.PushObject(&current), 1);
+                for (int round = 0; round < 2; ++round) {
+                    for (OETagID tag : {a, b, c, a}) {
+                        unsigned short expected = 0; // some row has the tag and covers the version
+                        for (unsigned short i = 0; i < o->count; ++i)
+                            if (o->rows[i].m_tag == tag && (o->rows[i].m_versionMask & o->version))
+                                expected = 1;
+                        EXPECT_EQ(parser.IsValidTag(tag), expected)
+                            << "tag " << tag << " version " << o->version << " rows " << o->count;
+                    }
+                }
+                ASSERT_EQ(parser.PopObject(), 1);
+            }
+        }
+    }
+}
