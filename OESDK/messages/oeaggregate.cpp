@@ -356,8 +356,8 @@ OE_COLD int LaterBit(const OEAggregateDesc& d, const OEAggregateIndex::Slot* s, 
 // Kept small, as it is inlined in every lookup: the rare cases are calls.
 inline const OEFieldRow* OEAggregate::Locate(const OEAggregateDesc& d, OETagID tag, int& bit) const {
     const unsigned short version = StoredMsgSetVersion();
-    const OEAggregateIndex* index = d.m_index.load(std::memory_order_acquire);
-    if (!index && !(index = d.MakeIndex())) return LocateByScan(d, tag, version, bit);
+    const OEAggregateIndex* index = d.Index();
+    if (!index) return LocateByScan(d, tag, version, bit);
     const OEAggregateIndex::Slot* s = index->Find(tag);
     if (!s) {
         bit = -1;
@@ -604,14 +604,7 @@ OEParseStatus OEAggregate::HandleTagElement(const OETagDictionaryEntry* entry, c
     if (!entry) return OEPS_INVALID;
     int bit;
     const OEFieldRow* row = Locate(Describe(), entry->m_id, bit);
-    if (!row) return OEPS_INVALID;
-    const OEFieldKind kind = row->m_kind;
-    if (kind == OEFK_TEXT) {
-        // The most common element, stored without StoreText's dispatch.
-        if (bit >= 0) StoreString(row, bit, value);
-        return OEPS_OK;
-    }
-    if (kind == OEFK_CHILD || kind == OEFK_LIST) return OEPS_INVALID;
+    if (!row || row->m_kind == OEFK_CHILD || row->m_kind == OEFK_LIST) return OEPS_INVALID;
     if (bit >= 0) StoreText(row, bit, value);
     return OEPS_OK;
 }

@@ -30,6 +30,13 @@ inline bool SameBytes(const char* a, const char* b, std::size_t n) {
     return true;
 }
 
+// "</NAME>" at `at` of the `size` bytes at `data`, NAME being the `length` bytes of `name`.
+inline bool EndTagAt(const char* data, unsigned long size, unsigned long at, const char* name,
+                     unsigned short length) {
+    return at + 3 + length <= size && data[at] == '<' && data[at + 1] == '/' &&
+           SameBytes(data + at + 2, name, length) && data[at + 2 + length] == '>';
+}
+
 inline bool EqualsIgnoringCase(const char* a, const char* b, std::size_t n) {
     for (std::size_t i = 0; i < n; ++i)
         if (Upper(a[i]) != Upper(b[i])) return false;
@@ -196,6 +203,13 @@ OEParseEngine::~OEParseEngine() {}
 
 inline void OEParseEngine::SyncOffset(unsigned long pos) {
     if (m_buffer) m_buffer->SetBufferOffset(pos);
+}
+
+// The element just read takes its own end tag, whose "<" stands at `at`, with it.
+inline void OEParseEngine::TakeElementEnd(unsigned long at, unsigned short nameLength) {
+    m_pos = at + 3 + nameLength;
+    m_elementEntry = nullptr;
+    m_elementClosed = true;
 }
 
 void OEParseEngine::LogAt(unsigned long pos, int code, const char* text, unsigned long length, OETagID tag) {
@@ -685,8 +699,8 @@ inline unsigned LowBits(unsigned n) {
 // bytes of `name`, whose first 16 bytes are `nameBlock`.
 inline bool ClosesElement(const char* data, unsigned long size, unsigned long at, __m128i nameBlock,
                           const char* name, unsigned short length) {
-    if (at + 3 + length > size || data[at + 1] != '/' || data[at + 2 + length] != '>') return false;
-    if (at + 18 > size) return SameBytes(data + at + 2, name, length);
+    if (at + 18 > size) return EndTagAt(data, size, at, name, length);
+    if (data[at + 1] != '/' || data[at + 2 + length] != '>') return false;
     const unsigned same =
         static_cast<unsigned>(_mm_movemask_epi8(_mm_cmpeq_epi8(Load16(data + at + 2), nameBlock)));
     return (same & LowBits(length)) == LowBits(length);
@@ -803,9 +817,7 @@ OE_ALWAYS_INLINE int OEParseEngine::FastToken(const OETagDictionaryEntry*& entry
     entry = e;
     // "</NAME>" with the very bytes of the start tag's name, right after the value.
     if (m_skipElementEnd && ClosesElement(base, m_size, end, t, name, nameLength)) {
-        m_pos = end + 3 + nameLength;
-        m_elementEntry = nullptr;
-        m_elementClosed = true;
+        TakeElementEnd(end, nameLength);
         return OETK_ELEMENT;
     }
     m_elementEntry = e;
@@ -913,13 +925,8 @@ OE_NOINLINE int OEParseEngine::GeneralToken(const OETagDictionaryEntry*& entry) 
                 // "</NAME>" with the very bytes of the start tag's name, right after the value:
                 // the token the end tag would give is the one the driver passes over.
                 const unsigned long at = next.m_next;
-                if (m_skipElementEnd && at + 3 + nameLength <= m_size && m_data[at] == '<' &&
-                    m_data[at + 1] == '/' && SameBytes(m_data + at + 2, name, nameLength) &&
-                    m_data[at + 2 + nameLength] == '>') {
-                    m_pos = at + 3 + nameLength;
-                    m_elementEntry = nullptr;
-                    m_elementClosed = true;
-                }
+                if (m_skipElementEnd && EndTagAt(m_data, m_size, at, name, nameLength))
+                    TakeElementEnd(at, nameLength);
                 return OETK_ELEMENT;
             }
             m_elementEntry = nullptr;

@@ -125,6 +125,7 @@ private:
     OE_INTERNAL void LogAt(unsigned long pos, int code, const char* text, unsigned long length,
                            OETagID tag = OETAG_NONE);
     OE_INTERNAL void SyncOffset(unsigned long pos);
+    OE_INTERNAL void TakeElementEnd(unsigned long at, unsigned short nameLength);
 
     OETagDictionary* m_dictionary;
     OEBuffer* m_buffer;
